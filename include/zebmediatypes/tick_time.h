@@ -1,0 +1,4 @@
+// TickTime and FrameRate.
+#pragma once
+
+#include <zebmediatypes/export.h>

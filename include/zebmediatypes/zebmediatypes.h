@@ -1,0 +1,16 @@
+// zebmediatypes: media value types. Including this header alone gives the
+// whole public API.
+#pragma once
+
+#include <zebmediatypes/export.h>
+
+// Time: ticks and frame rates, ratio times, displays and timecode, ranges.
+#include <zebmediatypes/tick_time.h>
+
+// Audio: channel labels and layouts, formats, channel maps, buses, native
+// rates, descriptions.
+
+// Video formats: pixel formats, selection and sizing, aspect ratios,
+// descriptions.
+
+// Colour records and caches, RGBA, MIME constants, library lifecycle.

@@ -1,0 +1,1 @@
+# Audio: channel labels and layouts, analysis, matrices, formats, maps, buses, rates, descriptions.

@@ -1,0 +1,1 @@
+# Colour records, serialization and caches, RGBA, MIME constants, library lifecycle.

@@ -1,0 +1,1 @@
+#include <zebmediatypes/tick_time.h>

@@ -1,0 +1,1 @@
+# Video formats: pixel formats, selection and sizing, aspect ratios, descriptions.

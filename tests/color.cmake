@@ -1,0 +1,1 @@
+# Colour, MIME and lifecycle tests.

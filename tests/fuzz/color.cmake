@@ -1,0 +1,1 @@
+# Colour fuzz targets.

@@ -1,0 +1,97 @@
+// Strings of the family and the conversions between them.
+//
+// Display texts are UTF-16 strings (`UTF16String`, char16_t elements). Keys and
+// serialized texts are UTF-8 byte strings (`UTF8String`, unsigned char
+// elements). Both use STLAllocator.
+//
+// Conversions never fail: an invalid sequence (a lone surrogate, a truncated or
+// overlong UTF-8 sequence, a byte that starts nothing) becomes U+FFFD and
+// reading goes on after it; nothing is read past the end of the input.
+#pragma once
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include <zebcore/allocator.h>
+#include <zebcore/export.h>
+#include <zebcore/flags.h>
+
+namespace zebcore {
+
+using UTF16String =
+    std::basic_string<char16_t, std::char_traits<char16_t>, allocator::STLAllocator<char16_t>>;
+using UTF8String = std::basic_string<unsigned char, std::char_traits<unsigned char>,
+                                     allocator::STLAllocator<unsigned char>>;
+using UTF16StringVector = std::vector<UTF16String, allocator::STLAllocator<UTF16String>>;
+using UTF8StringVector = std::vector<UTF8String, allocator::STLAllocator<UTF8String>>;
+
+namespace string {
+
+// ASCII text widened byte by byte; bytes above 0x7F become U+FFFD.
+ZEBCORE_API UTF16String AsciiToUTF16(std::string_view ascii);
+
+// UTF-8 to UTF-16. When `hadErrors` is given it is set to whether any invalid
+// sequence was replaced.
+ZEBCORE_API UTF16String UTF8to16(std::string_view utf8, bool* hadErrors = nullptr);
+ZEBCORE_API UTF16String UTF8to16(const UTF8String& utf8, bool* hadErrors = nullptr);
+
+// UTF-16 to UTF-8 (as bytes, or as a narrow std::string).
+ZEBCORE_API UTF8String UTF16to8(std::u16string_view utf16, bool* hadErrors = nullptr);
+ZEBCORE_API std::string UTF16toNarrow(std::u16string_view utf16, bool* hadErrors = nullptr);
+
+// The bytes of a narrow string as a UTF8String and back; no conversion.
+ZEBCORE_API UTF8String ToUTF8String(std::string_view bytes);
+ZEBCORE_API std::string ToStdString(const UTF8String& bytes);
+
+inline std::u16string_view View(const UTF16String& s) noexcept { return {s.data(), s.size()}; }
+inline std::string_view View(const UTF8String& s) noexcept {
+  return {reinterpret_cast<const char*>(s.data()), s.size()};
+}
+
+// NumberToString flags.
+enum ENumberToStringFlags : unsigned int {
+  kNumberToString_Default = 0,
+  kNumberToString_ShowPlusSign = 1,     // "+1.5" for positive values
+  kNumberToString_TrimTrailingZeros = 4 // "25" not "25.00"; "29.97" not "29.970"
+};
+
+// NumberToString()
+//
+// `value` in fixed notation with `fractionDigits` digits after the point
+// (rounded half away from zero at the last digit; 0 to 17), at least
+// `minIntegerDigits` digits before it (zero-padded), a '-' for negative values
+// and '.' as the decimal point whatever the locale. `maxLength` bounds the text:
+// when the fixed form would be longer, the value is written in scientific
+// notation with as many significant digits as fit. NaN is "nan", infinities
+// "inf" and "-inf".
+//
+//   NumberToString(29.97002997, 1, 2, kNumberToString_TrimTrailingZeros, 31)  // u"29.97"
+ZEBCORE_API UTF16String NumberToString(double value, int minIntegerDigits, int fractionDigits,
+                                       utility::Flags<unsigned int> flags,
+                                       std::size_t maxLength);
+
+// StringToNumber()
+//
+// Reads a whole decimal number (optional sign, digits, optional fraction and
+// exponent; surrounding white space allowed) into `value` and returns true.
+// Text that is not a number leaves `value` unchanged and returns false.
+ZEBCORE_API bool StringToNumber(std::u16string_view text, double& value);
+
+// Replaces each slot @0 to @9 in `text` with the replacement of that number.
+// "@@" is a literal '@'; an '@' not followed by a digit stays as it is.
+ZEBCORE_API UTF16String ReplaceInString(const UTF16String& text, const UTF16String& r0 = {},
+                                        const UTF16String& r1 = {}, const UTF16String& r2 = {},
+                                        const UTF16String& r3 = {}, const UTF16String& r4 = {},
+                                        const UTF16String& r5 = {}, const UTF16String& r6 = {},
+                                        const UTF16String& r7 = {}, const UTF16String& r8 = {},
+                                        const UTF16String& r9 = {});
+
+// Copies without the leading (LeftTrim) or trailing (RightTrim) white space
+// (space, tab, CR, LF, vertical tab, form feed).
+ZEBCORE_API UTF16String LeftTrim(std::u16string_view text);
+ZEBCORE_API UTF16String RightTrim(std::u16string_view text);
+
+}  // namespace string
+}  // namespace zebcore
