@@ -1,1 +1,5 @@
-# audio benchmarks.
+# Audio benchmarks.
+
+# Conversion matrix.
+
+# Native rates and descriptions.

@@ -1,1 +1,5 @@
-# time benchmarks.
+# Time benchmarks.
+
+# Ticks and frame rates.
+
+# Timecode text.

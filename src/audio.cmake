@@ -1,1 +1,9 @@
-# Audio: channel labels and layouts, analysis, matrices, formats, maps, buses, rates, descriptions.
+# Audio.
+
+# Channel labels, layouts, layout analysis, conversion matrix.
+target_sources(zebmediatypes PRIVATE
+)
+
+# Formats, channel maps, buses, native rates, descriptions.
+target_sources(zebmediatypes PRIVATE
+)

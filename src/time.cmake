@@ -1,5 +1,11 @@
 # Time: ticks, frame rates, ratio times, displays, timecode, ranges, console commands.
+
+# Ticks and frame rates, ratio times, time displays, time ranges.
 target_sources(zebmediatypes PRIVATE
   tick_time.cpp
+)
+
+# Timecode text and the console commands.
+target_sources(zebmediatypes PRIVATE
   commands/time_commands.cpp
 )

@@ -1,1 +1,5 @@
 # Audio tests.
+
+# Channel labels, layouts, layout analysis, conversion matrix.
+
+# Formats, channel maps, buses, native rates, descriptions.

@@ -7,8 +7,11 @@
 // Time: ticks and frame rates, ratio times, displays and timecode, ranges.
 #include <zebmediatypes/tick_time.h>
 
-// Audio: channel labels and layouts, formats, channel maps, buses, native
-// rates, descriptions.
+// Timecode text.
+
+// Audio: channel labels, layouts, analysis, conversion matrix.
+
+// Audio: formats, channel maps, buses, native rates, descriptions.
 
 // Video formats: pixel formats, selection and sizing, aspect ratios,
 // descriptions.
