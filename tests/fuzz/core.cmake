@@ -1,0 +1,1 @@
+# zebcore fuzz targets.
