@@ -197,14 +197,17 @@ void Newline(UTF8String& out, bool pretty, std::size_t depth) {
 }
 
 void AppendValue(UTF8String& out, const boost::any& value, bool pretty, std::size_t depth) {
-  if (depth > kMaxJSONDepth) {
-    // Deeper than any text we would read back (or a value that contains itself).
-    debug::ReportAssertion("depth <= kMaxJSONDepth", "JSON value nested too deeply to print",
+  const std::type_info& type = value.type();
+  const bool nests =
+      type == typeid(JSONObject) || type == typeid(JSONArray) || type == typeid(JSONValue);
+  if (nests && depth >= kMaxJSONDepth) {
+    // Deeper than any text that would be read back (or a value that contains
+    // itself): the text stays readable, the deep part becomes null.
+    debug::ReportAssertion("depth < kMaxJSONDepth", "JSON value nested too deeply to print",
                            __FILE__, "zebcore::serialization::GetJSONUTF8String", __LINE__);
     AppendAscii(out, "null");
     return;
   }
-  const std::type_info& type = value.type();
   if (value.empty()) {
     AppendAscii(out, "null");
   } else if (type == typeid(JSONObject)) {
@@ -245,7 +248,7 @@ void AppendValue(UTF8String& out, const boost::any& value, bool pretty, std::siz
   } else if (type == typeid(JSONValue)) {
     const auto& inner = *boost::any_cast<JSONValue>(&value);
     if (inner) {
-      AppendValue(out, *inner, pretty, depth + 1);
+      AppendValue(out, *inner, pretty, depth + 1);  // counted, so a self-reference ends
     } else {
       AppendAscii(out, "null");
     }
