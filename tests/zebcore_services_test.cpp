@@ -205,6 +205,19 @@ TEST(RecursiveMutex, IsRecursive) {
   EXPECT_EQ(zebcore::threads::RecursiveMutex(nullptr).Name(), "");
 }
 
+TEST(RecursiveMutex, UnlockWithoutAHoldIsReportedAndIgnored) {
+  zebcore::threads::RecursiveMutex mutex("unheld");
+  zebcore::debug::ScopedAssertionCapture capture;
+  mutex.Unlock();
+  EXPECT_EQ(capture.Count(), 1u);
+  ASSERT_TRUE(mutex.Lock("after", 0));  // still free
+  mutex.Unlock();
+  mutex.Unlock();  // one release too many
+  EXPECT_EQ(capture.Count(), 2u);
+  ASSERT_TRUE(mutex.Lock("again", 0));
+  mutex.Unlock();
+}
+
 // ---- Console ----
 
 class EchoCommand final : public zebcore::console::Command {
