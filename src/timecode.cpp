@@ -122,8 +122,10 @@ Fields ComputeFields(std::int64_t ticks, FrameRate rate, TimeDisplay display) {
   Fields out;
   if (const DropFrameNumbering* drop = DropFrameNumberingOf(display)) {
     const auto n = *drop;
-    out.negative = ticks < 0;
-    auto c = static_cast<std::int64_t>(Magnitude(FrameCount(ticks, CountingRate(rate, display))) %
+    const FrameRate counting = CountingRate(rate, display);
+    // The sign of the time, except that without a rate every time is zero.
+    out.negative = ticks < 0 && counting.IsValid();
+    auto c = static_cast<std::int64_t>(Magnitude(FrameCount(ticks, counting)) %
                                        static_cast<std::uint64_t>(24 * n.hourFrames));
     out.hours = static_cast<std::uint64_t>(c / n.hourFrames);
     c %= n.hourFrames;

@@ -236,6 +236,8 @@ TEST(TimeToTimecode, NoRateFormatsZeroFields) {
     SCOPED_TRACE(rate.GetTicksPerFrame());
     for (unsigned flags : {0u, unsigned{kTimecodeFlag_InclusiveEnd}}) {
       EXPECT_EQ(Narrow(TimeToTimecode(kTime_OneHour, rate, k24, flags)), "00:00:00:00");
+      EXPECT_EQ(Narrow(TimeToTimecode(-kTime_OneHour, rate, k24, flags)), "00:00:00:00");
+      EXPECT_EQ(Narrow(TimeToTimecode(-kTime_OneHour, rate, kDrop2997, flags)), "00;00;00;00");
       EXPECT_EQ(Narrow(TimeToTimecode(kTime_OneHour, rate, kFrames, flags)), "0");
       EXPECT_EQ(Narrow(TimeToTimecode(kTime_OneHour, rate, k35mm, flags)), "0+00");
     }
