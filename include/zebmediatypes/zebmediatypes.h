@@ -11,6 +11,7 @@
 #include <zebmediatypes/time_range.h>
 
 // Timecode text.
+#include <zebmediatypes/timecode.h>
 
 // Audio: channel labels, layouts, analysis, conversion matrix.
 
