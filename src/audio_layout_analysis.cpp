@@ -2,6 +2,7 @@
 #include <zebmediatypes/audio_channel_layout.h>
 
 #include <algorithm>
+#include <array>
 #include <iterator>
 #include <limits>
 #include <utility>
@@ -124,6 +125,17 @@ bool IsStereoPair(AudioChannelLabel a, AudioChannelLabel b) noexcept {
 
 bool ContainsSameChannelsIgnoreOrder(const AudioChannelLayout& a, const AudioChannelLayout& b) {
   if (a.size() != b.size()) return false;
+  // Common layouts are sorted on the stack; only large ones are copied to the heap.
+  constexpr std::size_t kOnStack = 32;
+  if (a.size() <= kOnStack) {
+    std::array<AudioChannelDescription, kOnStack> sortedA;
+    std::array<AudioChannelDescription, kOnStack> sortedB;
+    const auto endA = std::copy(a.begin(), a.end(), sortedA.begin());
+    const auto endB = std::copy(b.begin(), b.end(), sortedB.begin());
+    std::sort(sortedA.begin(), endA);
+    std::sort(sortedB.begin(), endB);
+    return std::equal(sortedA.begin(), endA, sortedB.begin());
+  }
   AudioChannelLayout sortedA = a;
   AudioChannelLayout sortedB = b;
   std::sort(sortedA.begin(), sortedA.end());

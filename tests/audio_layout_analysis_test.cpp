@@ -139,6 +139,19 @@ TEST(ContainsSameChannelsIgnoreOrder, ComparesLabelsWithMultiplicity) {
   }
 }
 
+TEST(ContainsSameChannelsIgnoreOrder, LongLayoutsCompareLikeShortOnes) {
+  for (std::size_t size : {31u, 32u, 33u, 64u}) {
+    SCOPED_TRACE(size);
+    AudioChannelLayout a = CreateMultichannelLayout(static_cast<int>(size));
+    a.front() = AudioChannelLabel::FrontLeft;
+    AudioChannelLayout b = a;
+    std::reverse(b.begin(), b.end());
+    EXPECT_TRUE(ContainsSameChannelsIgnoreOrder(a, b));
+    b.front() = AudioChannelLabel::FrontRight;
+    EXPECT_FALSE(ContainsSameChannelsIgnoreOrder(a, b));
+  }
+}
+
 TEST(NormalizeChannelOrder, SortsByLabelKeepingRepeats) {
   struct Case {
     const char* layout;
