@@ -14,6 +14,8 @@
 #include <zebmediatypes/timecode.h>
 
 // Audio: channel labels, layouts, analysis, conversion matrix.
+#include <zebmediatypes/audio_channel_layout.h>
+#include <zebmediatypes/channel_conversion_matrix.h>
 
 // Audio: formats, channel maps, buses, native rates, descriptions.
 
