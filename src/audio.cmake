@@ -2,6 +2,7 @@
 
 # Channel labels, layouts, layout analysis, conversion matrix.
 target_sources(zebmediatypes PRIVATE
+  audio_channel_layout.cpp
 )
 
 # Formats, channel maps, buses, native rates, descriptions.

@@ -10,6 +10,7 @@
 // Timecode text.
 
 // Audio: channel labels, layouts, analysis, conversion matrix.
+#include <zebmediatypes/audio_channel_layout.h>
 
 // Audio: formats, channel maps, buses, native rates, descriptions.
 
