@@ -3,3 +3,10 @@
 # Channel labels, layouts, layout analysis, conversion matrix.
 
 # Formats, channel maps, buses, native rates, descriptions.
+zmt_add_test(audio_formats_tests SOURCES
+  audio_format_test.cpp
+  channel_map_test.cpp
+  audio_bus_test.cpp
+  audio_frame_rate_utils_test.cpp
+  audio_descriptions_test.cpp
+)

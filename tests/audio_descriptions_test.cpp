@@ -1,0 +1,193 @@
+#include <gtest/gtest.h>
+#include <zebcore/localizer.h>
+#include <zebmediatypes/audio_descriptions.h>
+
+#include <cstdint>
+#include <string>
+
+namespace zebmediatypes {
+namespace {
+
+using L = AudioChannelLabel;
+using zebcore::UTF16String;
+
+std::string Narrow(const UTF16String& text) {
+  return zebcore::string::UTF16toNarrow(zebcore::string::View(text));
+}
+
+AudioChannelLayout Layout(std::initializer_list<AudioChannelLabel> labels) {
+  AudioChannelLayout layout;
+  for (AudioChannelLabel label : labels) layout.push_back(label);
+  return layout;
+}
+
+TEST(AudioChannelLabelDescription, GivesTheEnglishDefaults) {
+  struct Case {
+    AudioChannelLabel label;
+    const char* description;
+    const char* mnemonic;
+    const char* abbreviation;
+  };
+  const Case kCases[] = {
+      {L::Discrete, "Mono", "&Mono", "*"},
+      {L::LowFrequency, "Low Frequency Effects", "Low Fre&quency Effects", "LFE"},
+      {L::BackLeft, "Left Surround", "L&eft Surround", "Ls"},
+      {L::SideRight, "Right Surround Direct", "Right Surround &Direct", "Rsd"},
+      {L::TopFrontCenter, "Vertical Height Center", "Vertical Height &Center", "Vhc"},
+      {L::TopBackCenter, "Top Back Center", "Top Back &Center", "Tbc"},
+      {L::LeftHeight, "Top Side Left", "Top Side Le&ft", "Tsl"},
+      {L::LFE2, "Low Frequency Effects 2", "Low Frequency Effects &2", "LFE2"},
+      {L::ProximityRight, "Proximity Right", "Pro&ximity Right", "Pr"},
+      {L::AmbisonicsHOA, "Higher Order Ambisonics", "Higher Order &Ambisonics", "*"},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(static_cast<std::uint32_t>(c.label));
+    EXPECT_EQ(Narrow(AudioChannelLabelDescription(c.label, false)), c.description);
+    EXPECT_EQ(Narrow(AudioChannelLabelDescription(c.label, true)), c.mnemonic);
+    EXPECT_EQ(Narrow(AudioChannelLabelAbbreviations(c.label)), c.abbreviation);
+  }
+  EXPECT_EQ(Narrow(AudioChannelLabelAbbreviationsUnlocalized(L::AmbisonicsHOA)), "");
+  EXPECT_EQ(Narrow(AudioChannelLabelAbbreviationsUnlocalized(L::Discrete)), "*");
+}
+
+TEST(AudioChannelLabelDescription, EveryLabelHasTextsAndOneAccessKey) {
+  for (const AudioChannelDescription& d : GetSupportedAudioChannelDescriptions()) {
+    SCOPED_TRACE(static_cast<std::uint32_t>(d.label));
+    const std::string description = Narrow(AudioChannelLabelDescription(d.label, false));
+    std::string mnemonic = Narrow(AudioChannelLabelDescription(d.label, true));
+    ASSERT_FALSE(description.empty());
+    ASSERT_EQ(std::count(mnemonic.begin(), mnemonic.end(), '&'), 1);
+    mnemonic.erase(mnemonic.find('&'), 1);
+    EXPECT_EQ(mnemonic, description);
+    EXPECT_FALSE(AudioChannelLabelAbbreviations(d.label).empty());
+    if (d.label != L::AmbisonicsHOA) {
+      EXPECT_EQ(AudioChannelLabelAbbreviations(d.label),
+                AudioChannelLabelAbbreviationsUnlocalized(d.label));
+    }
+  }
+}
+
+TEST(AudioChannelLabelDescription, UnknownValuesGiveEmptyTexts) {
+  constexpr std::uint32_t kUnknown[] = {1, 99, 120, 125, 126, 144, 1000, 0x7FFFFFFF, 0xFFFFFFFF};
+  for (std::uint32_t value : kUnknown) {
+    SCOPED_TRACE(value);
+    const auto label = static_cast<AudioChannelLabel>(value);
+    EXPECT_TRUE(AudioChannelLabelDescription(label, false).empty());
+    EXPECT_TRUE(AudioChannelLabelDescription(label, true).empty());
+    EXPECT_TRUE(AudioChannelLabelAbbreviations(label).empty());
+    EXPECT_TRUE(AudioChannelLabelAbbreviationsUnlocalized(label).empty());
+  }
+}
+
+TEST(AudioChannelLayoutDescription, NamesCommonLayoutsAndListsTheOthers) {
+  struct Case {
+    AudioChannelLayout layout;
+    const char* text;
+  };
+  const Case kCases[] = {
+      {{}, "0 Channels"},
+      {CreateMonoChannelLayout(), "Mono"},
+      {CreateMultichannelLayout(2), "2 Channels"},
+      {CreateMultichannelLayout(4), "4 Channels"},
+      {CreateStereoChannelLayout(), "Stereo"},
+      {Layout({L::FrontRight, L::FrontLeft}), "2 Channels (R L)"},
+      {CreateMatrixStereoChannelLayout(), "2 Channels (Lt Rt)"},
+      {Layout({L::FrontCenter}), "1 Channel (C)"},
+      {Layout({L::FrontLeft, L::Discrete, L::FrontRight}), "3 Channels (L * R)"},
+      {CreateBroadcast51ChannelLayout(), "5.1 (L, R, C, LFE, Ls, Rs)"},
+      {CreateLegacy51ChannelLayout(), "5.1 (L, R, Ls, Rs, C, LFE)"},
+      {CreateHexagonalChannelLayout(), "6 Channels (L R Ls Rs C Cs)"},
+      {Create_L_R_C_LFE_Ls_Rs_Cs_ChannelLayout(), "7 Channels (L R C LFE Ls Rs Cs)"},
+      {CreateSmpteDtvChannelLayout(), "SMPTE DTV (L R C LFE Ls Rs Lt Rt)"},
+      {Layout({L::FrontRight, L::FrontLeft, L::FrontCenter, L::LowFrequency, L::BackLeft,
+               L::BackRight, L::LeftTotal, L::RightTotal}),
+       "8 Channels (R L C LFE Ls Rs Lt Rt)"},
+      {Create7_1ItuChannelLayout(), "8 Channels (L R C LFE Ls Rs Rls Rrs)"},
+      {CreateVST10_2ChannelLayout(), "12 Channels (L R C LFE Ls Rs Vhl...)"},
+      {CreateSMPTEDigitalCinema6Channel(), "16 Channels (L R C LFE Ls Rs *...)"},
+      {Layout({static_cast<L>(0xFFFFFFFFu), L::FrontLeft}), "2 Channels ( L)"},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.text);
+    EXPECT_EQ(Narrow(AudioChannelLayoutDescription(c.layout)), c.text);
+  }
+  EXPECT_EQ(Narrow(AudioChannelLayoutDescriptionUnlocalized(CreateBroadcast51ChannelLayout())),
+            "L,R,C,LFE,Ls,Rs,");
+  EXPECT_EQ(Narrow(AudioChannelLayoutDescriptionUnlocalized({})), "");
+}
+
+TEST(AudioChannelLayoutDescription, UsesTheInstalledTranslations) {
+  auto& localizer = zebcore::config::Localizer::Get();
+  localizer.InstallTranslations({{"$$$/zebmediatypes/AudioChannelLabelAbbreviations/L", u"G"},
+                                 {"$$$/zebmediatypes/AudioChannelLayout/Stereo", u"Stéréo"}});
+  const std::string fiveOne =
+      Narrow(AudioChannelLayoutDescription(CreateBroadcast51ChannelLayout()));
+  const std::string stereo = Narrow(AudioChannelLayoutDescription(CreateStereoChannelLayout()));
+  const std::string unlocalized =
+      Narrow(AudioChannelLayoutDescriptionUnlocalized(CreateStereoChannelLayout()));
+  localizer.ClearTranslations();
+  EXPECT_EQ(fiveOne, "5.1 (G, R, C, LFE, Ls, Rs)");
+  EXPECT_EQ(stereo, "Stéréo");
+  EXPECT_EQ(unlocalized, "L,R,");
+}
+
+TEST(AudioChannelConfigurationDescription, DescribesTheStreamsOfAnItem) {
+  const AudioChannelLayout stereo = CreateStereoChannelLayout();
+  const AudioChannelLayout mono = CreateMonoChannelLayout();
+  const AudioChannelLayout fiveOne = CreateBroadcast51ChannelLayout();
+  struct Case {
+    AudioChannelLayoutList layouts;
+    const char* text;
+  };
+  const Case kCases[] = {
+      {{}, "(No Audio Streams)"},
+      {{stereo}, "Stereo"},
+      {{stereo, stereo}, "2 x Stereo"},
+      {{stereo, stereo, stereo}, "3 x Stereo"},
+      {{fiveOne, stereo}, "5.1 (L, R, C, LFE, Ls, Rs) + Stereo"},
+      {{stereo, mono, stereo}, "3 Audio Streams"},
+      {{stereo, stereo, mono}, "3 Audio Streams"},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.text);
+    EXPECT_EQ(Narrow(AudioChannelConfigurationDescription(c.layouts)), c.text);
+  }
+}
+
+TEST(GetChannelMappingLabels, ShowsWhatIsRoutedToEachNumberedChannel) {
+  const ChannelMap map = ChannelMap::CreateDefaultChannelMap(2);
+  struct Case {
+    unsigned int count;
+    AudioChannelLayout layout;
+    const char* text;
+  };
+  const Case kCases[] = {
+      {3, CreateStereoChannelLayout(), "L, R, _"}, {3, Layout({L::FrontLeft}), "L, ?, _"},
+      {3, CreateMultichannelLayout(2), "1, 2, _"}, {1, CreateStereoChannelLayout(), "L"},
+      {0, CreateStereoChannelLayout(), ""},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.text);
+    EXPECT_EQ(Narrow(GetChannelMappingLabels(map, c.count, c.layout)), c.text);
+  }
+}
+
+TEST(GetChannelName, NumbersDiscreteChannelsFromOne) {
+  const AudioChannelLayout discrete = CreateMultichannelLayout(2);
+  EXPECT_EQ(Narrow(GetChannelName(discrete, 1, true)), "2");
+  EXPECT_EQ(Narrow(GetChannelName(discrete, 1, false)), "Mono");
+  EXPECT_EQ(Narrow(GetChannelName(discrete, 2, true)), "");
+  EXPECT_EQ(Narrow(GetChannelName(CreateStereoChannelLayout(), 0, true)), "Left");
+  EXPECT_EQ(Narrow(GetChannelName({}, 0xFFFFFFFFu, true)), "");
+}
+
+TEST(GetAmbisonicsAudioChannelLabelDescription, WritesTheIndexAsGiven) {
+  EXPECT_EQ(Narrow(GetAmbisonicsAudioChannelLabelDescription(0, false)), "Ambisonic ACN 0");
+  EXPECT_EQ(Narrow(GetAmbisonicsAudioChannelLabelDescription(3, false)), "Ambisonic ACN 3");
+  EXPECT_EQ(Narrow(GetAmbisonicsAudioChannelLabelDescription(15, true)), "AMB15");
+  EXPECT_EQ(Narrow(GetAmbisonicsAudioChannelLabelDescription(SIZE_MAX, true)),
+            "AMB18446744073709551615");
+}
+
+}  // namespace
+}  // namespace zebmediatypes
