@@ -215,18 +215,21 @@ UTF16String AudioChannelLayoutDescription(const AudioChannelLayout& layout) {
     if (count == 1) return Localize(kMonoKey);
     return ReplaceInString(Localize(kNChannelsKey), UnsignedText(count));
   }
+  // The named layouts, built once.
+  static const AudioChannelLayout kStereo = CreateStereoChannelLayout();
+  static const AudioChannelLayout kSurround51 = CreateBroadcast51ChannelLayout();
+  static const AudioChannelLayout kSmpteDtv = CreateSmpteDtvChannelLayout();
   switch (count) {
     case 2:
-      if (layout == CreateStereoChannelLayout()) return Localize(kStereoKey);
+      if (layout == kStereo) return Localize(kStereoKey);
       break;
     case 6:
-      if (ContainsSameChannelsIgnoreOrder(layout, CreateBroadcast51ChannelLayout())) {
+      if (ContainsSameChannelsIgnoreOrder(layout, kSurround51)) {
         return FillWithAbbreviations(k51Key, layout);
       }
       break;
     case 8:
-      if (layout == CreateSmpteDtvChannelLayout())
-        return FillWithAbbreviations(kSmpteDtvKey, layout);
+      if (layout == kSmpteDtv) return FillWithAbbreviations(kSmpteDtvKey, layout);
       break;
     default:
       break;
