@@ -77,33 +77,22 @@ constexpr LabelTexts kLabelTexts[] = {
                ZMT_LABEL_KEYS(AmbisonicsHOA, "Higher Order Ambisonics", "Higher Order &Ambisonics"),
                nullptr, ""},
 };
-static_assert(std::size(kLabelTexts) == 38);
+static_assert(std::size(kLabelTexts) == kAudioChannelLabelCount);
 
 #undef ZMT_LABEL
 #undef ZMT_LABEL_KEYS
 
-// The label values are 0, 100 to 119 and 127 to 143; the rows follow them.
-constexpr std::uint32_t kFirstFrontGroup = 100, kLastFrontGroup = 119;
-constexpr std::uint32_t kFirstHeightGroup = 127, kLastHeightGroup = 143;
-constexpr std::size_t kFirstHeightRow = 1 + (kLastFrontGroup - kFirstFrontGroup + 1);
-
 // The row of `label`, or null when the value is no label.
 constexpr const LabelTexts* FindLabelTexts(AudioChannelLabel label) noexcept {
-  const auto value = static_cast<std::uint32_t>(label);
-  if (value == 0) return &kLabelTexts[0];
-  if (value >= kFirstFrontGroup && value <= kLastFrontGroup) {
-    return &kLabelTexts[1 + (value - kFirstFrontGroup)];
-  }
-  if (value >= kFirstHeightGroup && value <= kLastHeightGroup) {
-    return &kLabelTexts[kFirstHeightRow + (value - kFirstHeightGroup)];
-  }
-  return nullptr;
+  const std::size_t index = AudioChannelLabelIndex(label);
+  return index < std::size(kLabelTexts) ? &kLabelTexts[index] : nullptr;
 }
 
 constexpr bool RowsFollowLabelValues() {
-  for (const LabelTexts& row : kLabelTexts) {
-    const LabelTexts* found = FindLabelTexts(static_cast<AudioChannelLabel>(row.value));
-    if (found == nullptr || found->value != row.value) return false;
+  for (std::size_t i = 0; i < std::size(kLabelTexts); ++i) {
+    if (AudioChannelLabelIndex(static_cast<AudioChannelLabel>(kLabelTexts[i].value)) != i) {
+      return false;
+    }
   }
   return true;
 }

@@ -2,8 +2,10 @@
 #include <zebcore/localizer.h>
 #include <zebmediatypes/audio_descriptions.h>
 
+#include <algorithm>
 #include <cstdint>
 #include <string>
+#include <utility>
 
 namespace zebmediatypes {
 namespace {
@@ -187,6 +189,103 @@ TEST(GetAmbisonicsAudioChannelLabelDescription, WritesTheIndexAsGiven) {
   EXPECT_EQ(Narrow(GetAmbisonicsAudioChannelLabelDescription(15, true)), "AMB15");
   EXPECT_EQ(Narrow(GetAmbisonicsAudioChannelLabelDescription(SIZE_MAX, true)),
             "AMB18446744073709551615");
+}
+
+}  // namespace
+}  // namespace zebmediatypes
+
+namespace zebmediatypes {
+namespace {
+
+// Installs `translations` for the life of the object.
+class ScopedTranslations {
+ public:
+  explicit ScopedTranslations(zebcore::config::Localizer::Translations translations) {
+    zebcore::config::Localizer::Get().InstallTranslations(std::move(translations));
+  }
+  ~ScopedTranslations() { zebcore::config::Localizer::Get().ClearTranslations(); }
+};
+
+TEST(AudioDescriptions, LayoutAndStreamTextsComeFromTheirKeys) {
+  const std::string p = "$$$/zebmediatypes/";
+  const ScopedTranslations translations({
+      {p + "AudioChannelLayout/Mono", u"mono"},
+      {p + "AudioChannelLayout/Stereo", u"stereo"},
+      {p + "AudioChannelLayout/NChannels", u"n@0"},
+      {p + "AudioChannelLayout/kChannelConfigurationNameTemplate_1", u"t1 @0"},
+      {p + "AudioChannelLayout/kChannelConfigurationNameTemplate_3", u"t3 @0@1@2"},
+      {p + "kChannelConfigurationNameTemplate_51", u"t51 @0@5"},
+      {p + "AudioChannelLayout/kChannelConfigurationNameTemplate_6", u"t6 @0@5"},
+      {p + "SmpteDtv", u"dtv @7"},
+      {p + "AudioChannelLayout/kChannelConfigurationNameTemplate_8", u"t8 @7"},
+      {p + "AudioChannelLayout/kChannelConfigurationNameTemplate_N", u"tN @0 @7 @8"},
+      {p + "AudioChannelConfiguration/Empty", u"none"},
+      {p + "AudioChannelConfiguration/NMatchingStreams", u"@1*@0"},
+      {p + "AudioChannelConfiguration/TwoStreams", u"@1&@0"},
+      {p + "AudioChannelConfiguration/NAudioStreams", u"s@0"},
+      {p + "AmbisonicsChannelName", u"acn@0"},
+      {p + "AmbisonicsAbbreviatedChannelName", u"amb@0"},
+      {p + "ChannelMapDelimiter", u"|"},
+      {p + "AudioChannelLabelAbbreviations/Rrs", u"rrs"},
+  });
+  const AudioChannelLayout stereo = CreateStereoChannelLayout();
+  struct Case {
+    UTF16String text;
+    const char* expected;
+  };
+  const Case kCases[] = {
+      {AudioChannelLayoutDescription(CreateMonoChannelLayout()), "mono"},
+      {AudioChannelLayoutDescription(stereo), "stereo"},
+      {AudioChannelLayoutDescription(CreateMultichannelLayout(3)), "n3"},
+      {AudioChannelLayoutDescription(Layout({L::FrontCenter})), "t1 C"},
+      {AudioChannelLayoutDescription(Create_L_R_C_ChannelLayout()), "t3 LRC"},
+      {AudioChannelLayoutDescription(CreateLegacy51ChannelLayout()), "t51 LLFE"},
+      {AudioChannelLayoutDescription(CreateHexagonalChannelLayout()), "t6 LCs"},
+      {AudioChannelLayoutDescription(CreateSmpteDtvChannelLayout()), "dtv Rt"},
+      {AudioChannelLayoutDescription(Create7_1ItuChannelLayout()), "t8 rrs"},
+      {AudioChannelLayoutDescription(CreateVST10_2ChannelLayout()), "tN 12 Vhl "},
+      {AudioChannelConfigurationDescription({}), "none"},
+      {AudioChannelConfigurationDescription({stereo, stereo}), "stereo*2"},
+      {AudioChannelConfigurationDescription({stereo, CreateMonoChannelLayout()}), "mono&stereo"},
+      {AudioChannelConfigurationDescription({stereo, stereo, {}}), "s3"},
+      {GetAmbisonicsAudioChannelLabelDescription(4, false), "acn4"},
+      {GetAmbisonicsAudioChannelLabelDescription(4, true), "amb4"},
+      {GetChannelMappingLabels(ChannelMap::CreateDefaultChannelMap(2), 3, stereo), "L|R|_"},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.expected);
+    EXPECT_EQ(Narrow(c.text), c.expected);
+  }
+}
+
+TEST(AudioDescriptions, LabelTextsComeFromKeysNamedAfterTheLabel) {
+  struct Case {
+    AudioChannelLabel label;
+    const char* name;
+    const char* abbreviation;  // null where it is not localized
+  };
+  const Case kCases[] = {
+      {L::Discrete, "Discrete", nullptr},          {L::FrontLeft, "FrontLeft", "L"},
+      {L::TopFrontRight, "TopFrontRight", "Vhr"},  {L::TopFrontCenter, "TopFrontCenter", "Vhc"},
+      {L::LeftHeight, "LeftHeight", "Tsl"},        {L::LFE2, "LFE2", "LFE2"},
+      {L::ProximityRight, "ProximityRight", "Pr"}, {L::AmbisonicsHOA, "AmbisonicsHOA", nullptr},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.name);
+    zebcore::config::Localizer::Translations translations = {
+        {std::string("$$$/zebmediatypes/AudioChannelLabel/") + c.name, u"description"},
+        {std::string("$$$/zebmediatypes/AudioChannelLabelMnemonic/") + c.name, u"&mnemonic"}};
+    if (c.abbreviation != nullptr) {
+      translations[std::string("$$$/zebmediatypes/AudioChannelLabelAbbreviations/") +
+                   c.abbreviation] = u"abbreviation";
+    }
+    const ScopedTranslations installed(std::move(translations));
+    EXPECT_EQ(Narrow(AudioChannelLabelDescription(c.label, false)), "description");
+    EXPECT_EQ(Narrow(AudioChannelLabelDescription(c.label, true)), "&mnemonic");
+    EXPECT_EQ(Narrow(AudioChannelLabelAbbreviations(c.label)),
+              c.abbreviation != nullptr ? "abbreviation" : "*");
+    EXPECT_NE(Narrow(AudioChannelLabelAbbreviationsUnlocalized(c.label)), "abbreviation");
+  }
 }
 
 }  // namespace
