@@ -25,15 +25,6 @@ AudioFormat Format(int rate, AudioSampleType type, const AudioChannelLayout& lay
   return format;
 }
 
-TEST(AudioFormat, DefaultHoldsNothing) {
-  const AudioFormat format;
-  EXPECT_EQ(format.GetSampleRate(), 0);
-  EXPECT_EQ(static_cast<std::uint32_t>(format.GetSampleType()), 0u);
-  EXPECT_EQ(format.GetChannelCount(), 0u);
-  EXPECT_EQ(format.GetSampleAlignment(), 0);
-  EXPECT_EQ(kAudioSampleRate_Invalid, -1);
-}
-
 TEST(AudioFormat, CreateDefaultAudioFormatChoosesTheLayoutByCount) {
   const AudioChannelLabel D = L::Discrete;
   struct Case {
@@ -111,25 +102,6 @@ TEST(AudioFormat, ChannelLookupsGiveNeutralResultsOutOfRange) {
   EXPECT_EQ(stereo.GetChannelIndex(L::FrontLeft), 0u);  // first of two
   EXPECT_EQ(stereo.GetChannelIndex(L::FrontRight), 1u);
   EXPECT_EQ(stereo.GetChannelIndex(L::FrontCenter), stereo.GetChannelCount());
-}
-
-TEST(AudioFormat, CopiesAndSwapsAllFields) {
-  const AudioFormat a =
-      Format(44100, kAudioSampleType_24BitInteger, CreateQuadraphonicChannelLayout());
-  const AudioFormat b = AudioFormat::CreateDefaultAudioFormat(6, 96000);
-  AudioFormat x = a;
-  AudioFormat y = b;
-  EXPECT_EQ(x, a);
-  x.swap(y);
-  EXPECT_EQ(x, b);
-  EXPECT_EQ(y, a);
-  x = x;  // self-assignment keeps the value
-  EXPECT_EQ(x, b);
-  AudioChannelLayout copy;
-  a.GetChannelLayout(copy);
-  EXPECT_EQ(copy, a.GetChannelLayout());
-  x.SetChannelLayout(x.GetChannelLayout());
-  EXPECT_EQ(x, b);
 }
 
 TEST(AudioFormat, EqualityNeedsRateTypeAndLabelsInOrder) {
