@@ -10,3 +10,7 @@ zmt_add_test(audio_formats_tests SOURCES
   audio_frame_rate_utils_test.cpp
   audio_descriptions_test.cpp
 )
+zmt_add_test(audio_descriptions_concurrency_tests SOURCES
+  audio_descriptions_concurrency_test.cpp
+  CONCURRENT
+)
