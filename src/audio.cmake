@@ -3,6 +3,8 @@
 # Channel labels, layouts, layout analysis, conversion matrix.
 target_sources(zebmediatypes PRIVATE
   audio_channel_layout.cpp
+  audio_layout_analysis.cpp
+  channel_conversion_matrix.cpp
 )
 
 # Formats, channel maps, buses, native rates, descriptions.

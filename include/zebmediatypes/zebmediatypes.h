@@ -14,6 +14,7 @@
 
 // Audio: channel labels, layouts, analysis, conversion matrix.
 #include <zebmediatypes/audio_channel_layout.h>
+#include <zebmediatypes/channel_conversion_matrix.h>
 
 // Audio: formats, channel maps, buses, native rates, descriptions.
 #include <zebmediatypes/audio_format.h>
