@@ -8,8 +8,9 @@
 // unlocalized return fixed ASCII text. None fails on any input: labels that
 // are not in the enumeration give empty texts (or "*" where stated).
 //
-//   AudioChannelLayoutDescription(CreateBroadcast51ChannelLayout());  // u"5.1 (L, R, C, LFE, Ls,
-//   Rs)" AudioChannelConfigurationDescription({stereo, stereo});           // u"2 x Stereo"
+//   AudioChannelLayoutDescription(CreateBroadcast51ChannelLayout());
+//       // u"5.1 (L, R, C, LFE, Ls, Rs)"
+//   AudioChannelConfigurationDescription({stereo, stereo});   // u"2 x Stereo"
 #pragma once
 
 #include <zebcore/string.h>

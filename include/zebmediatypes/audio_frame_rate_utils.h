@@ -5,9 +5,10 @@
 // FindBestNativeAudioRate(). Rates are FrameRate values: ticks per sample, so
 // fewer ticks is a faster rate.
 //
-//   FindBestNativeAudioRate(FrameRate::FromFramesPerSecond(24000));// kFrameRate_Audio48000 (2 x
-//   24000) FindBestNativeAudioRate(FrameRate::FromFramesPerSecond(30000));// kFrameRate_Audio32000
-//   (next rate above)
+//   FindBestNativeAudioRate(FrameRate::FromFramesPerSecond(24000));
+//       // kFrameRate_Audio48000, twice the rate
+//   FindBestNativeAudioRate(FrameRate::FromFramesPerSecond(30000));
+//       // kFrameRate_Audio32000, the next rate above
 #pragma once
 
 #include <zebcore/allocator.h>
