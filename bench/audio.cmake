@@ -7,3 +7,4 @@ zmt_add_benchmark(channel_conversion_matrix_bench
   LIBS PkgConfig::SWR)
 
 # Native rates and descriptions.
+zmt_add_benchmark(audio_bench SOURCES audio_bench.cpp)

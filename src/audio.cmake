@@ -9,4 +9,9 @@ target_sources(zebmediatypes PRIVATE
 
 # Formats, channel maps, buses, native rates, descriptions.
 target_sources(zebmediatypes PRIVATE
+  audio_format.cpp
+  channel_map.cpp
+  audio_bus.cpp
+  audio_frame_rate_utils.cpp
+  audio_descriptions.cpp
 )

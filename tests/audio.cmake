@@ -8,3 +8,14 @@ zmt_add_test(audio_layout_tests SOURCES
 zmt_add_test(audio_layout_concurrency_tests SOURCES audio_layout_concurrency_test.cpp CONCURRENT)
 
 # Formats, channel maps, buses, native rates, descriptions.
+zmt_add_test(audio_formats_tests SOURCES
+  audio_format_test.cpp
+  channel_map_test.cpp
+  audio_bus_test.cpp
+  audio_frame_rate_utils_test.cpp
+  audio_descriptions_test.cpp
+)
+zmt_add_test(audio_descriptions_concurrency_tests SOURCES
+  audio_descriptions_concurrency_test.cpp
+  CONCURRENT
+)

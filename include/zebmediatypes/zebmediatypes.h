@@ -18,6 +18,11 @@
 #include <zebmediatypes/channel_conversion_matrix.h>
 
 // Audio: formats, channel maps, buses, native rates, descriptions.
+#include <zebmediatypes/audio_format.h>
+#include <zebmediatypes/channel_map.h>
+#include <zebmediatypes/audio_bus.h>
+#include <zebmediatypes/audio_frame_rate_utils.h>
+#include <zebmediatypes/audio_descriptions.h>
 
 // Video formats: pixel formats, selection and sizing, aspect ratios,
 // descriptions.
