@@ -1,3 +1,5 @@
+#include <gtest/gtest.h>
+#include <zebcore/assert.h>
 #include <zebmediatypes/pixel_format.h>
 
 #include <algorithm>
@@ -5,9 +7,6 @@
 #include <iterator>
 #include <string>
 #include <type_traits>
-
-#include <gtest/gtest.h>
-#include <zebcore/assert.h>
 
 namespace zebmediatypes {
 namespace {
@@ -164,9 +163,9 @@ unsigned AlphaLetter(char c) { return c == 'A' ? 1 : c == 'P' ? 2 : c == 'X' ? 3
 
 StatedFields FieldsFromName(const std::string& s) {
   StatedFields f;
-  const char* kDVNames[] = {"NTSCDV25",         "PALDV25",         "NTSC_DV100_720p",
-                            "PAL_DV100_720p",   "NTSC_DV100_1080i", "PAL_DV100_1080i",
-                            "NTSCDV50",         "PALDV50"};
+  const char* kDVNames[] = {"NTSCDV25",       "PALDV25",          "NTSC_DV100_720p",
+                            "PAL_DV100_720p", "NTSC_DV100_1080i", "PAL_DV100_1080i",
+                            "NTSCDV50",       "PALDV50"};
   for (unsigned i = 0; i < std::size(kDVNames); ++i) {
     if (s == kDVNames[i]) {
       f.isYUV = true;
@@ -310,13 +309,13 @@ TEST(GuessNameForProperties, FindsTheFirstRowOfAWord) {
       {0x0E98E3, Name("POi0")},  // shared with Phl0: the earlier row wins
       {0x0F1863, Name("PO1f")},  // shared with PHLf
       {0x00178000, 0},
-      {0x00100000, 0},                            // validity 2 whatever else is set
+      {0x00100000, 0},  // validity 2 whatever else is set
       {0x00078000, kPixelFormatFourCC_Invalid},
-      {0x00000000, kPixelFormatFourCC_Invalid},   // validity 0
-      {0x000F8881, kPixelFormatFourCC_Invalid},   // uyvy with packing 15
-      {0x00180881, kPixelFormatFourCC_Invalid},   // uyvy with validity 3
-      {0x00080981, kPixelFormatFourCC_Invalid},   // uyvy with straight alpha
-      {0x00880881, kPixelFormatFourCC_Invalid},   // uyvy with a reserved bit
+      {0x00000000, kPixelFormatFourCC_Invalid},  // validity 0
+      {0x000F8881, kPixelFormatFourCC_Invalid},  // uyvy with packing 15
+      {0x00180881, kPixelFormatFourCC_Invalid},  // uyvy with validity 3
+      {0x00080981, kPixelFormatFourCC_Invalid},  // uyvy with straight alpha
+      {0x00880881, kPixelFormatFourCC_Invalid},  // uyvy with a reserved bit
   };
   for (const Case& c : kCases) {
     SCOPED_TRACE(c.word);
@@ -450,8 +449,9 @@ TEST(TranslateFourCC, MapsCodecAliasesOntoTheirFamily) {
     unsigned int want;
   };
   constexpr Case kCases[] = {
-      {0x63766130, 0x63766130}, {0x63766131, 0x61766369}, {0x63766133, 0x61766369},
-      {0x63766134, 0x61766369}, {0x63766135, 0x63766135}, {0x4D435054, 0x4D504547},
+      {0x63766130, 0x63766130}, {0x63766131, 0x61766369},
+      {0x63766133, 0x61766369}, {0x63766134, 0x61766369},
+      {0x63766135, 0x63766135}, {0x4D435054, 0x4D504547},
       {0x61766331, 0x61766331}, {0, 0},
   };
   for (const Case& c : kCases) {
