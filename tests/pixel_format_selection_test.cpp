@@ -397,7 +397,9 @@ TEST(PixelFormatSize, ZeroAndNegativeDimensionsGiveZero) {
     for (const Size& s : kSizes) {
       SCOPED_TRACE(testing::Message() << pf->fourCC << " " << s.width << "x" << s.height);
       EXPECT_EQ(PixelFormatSize(*pf, s.width, s.height), 0u);
-      if (s.width <= 0) EXPECT_EQ(UncompressedPixelFormatRowBytes(*pf, s.width), 0u);
+      if (s.width <= 0) {
+        EXPECT_EQ(UncompressedPixelFormatRowBytes(*pf, s.width), 0u);
+      }
     }
   }
 }
