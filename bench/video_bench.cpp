@@ -167,6 +167,8 @@ void SelectNearestPixelFormatTypical(benchmark::State& state) {
 // Keeps each run's per-call time for the side-by-side summary.
 class SummaryReporter : public benchmark::ConsoleReporter {
  public:
+  SummaryReporter() : ConsoleReporter(OO_Tabular) {}
+
   void ReportRuns(const std::vector<Run>& runs) override {
     ConsoleReporter::ReportRuns(runs);
     for (const Run& run : runs) {

@@ -159,47 +159,56 @@ constexpr PixelFormatEntry kBuiltInPixelFormats[] = {
 };
 static_assert(std::size(kBuiltInPixelFormats) == kBuiltInPixelFormatCount);
 
-// Row numbers ordered by a key, ties kept in catalogue order, so that a binary
-// search for the first equal key finds the row a linear scan would.
-using RowIndex = std::array<std::uint8_t, kBuiltInPixelFormatCount>;
+// Open-addressing hash indexes over the catalogue, built at compile time.
+// A slot holds a row number + 1 (0 = empty). Rows are inserted in catalogue
+// order and a key already present is not inserted again, so a lookup finds
+// the first row of a key, as a scan in catalogue order would.
+constexpr std::size_t kIndexSlots = 256;  // more than twice the rows: short probes
+using HashIndex = std::array<std::uint8_t, kIndexSlots>;
 
-template <class Key>
-constexpr RowIndex SortedRows(Key key) {
-  RowIndex rows{};
-  for (std::size_t i = 0; i < rows.size(); ++i) rows[i] = static_cast<std::uint8_t>(i);
-  for (std::size_t i = 1; i < rows.size(); ++i) {  // insertion sort: stable
-    const std::uint8_t row = rows[i];
-    std::size_t j = i;
-    while (j > 0 && key(kBuiltInPixelFormats[row]) < key(kBuiltInPixelFormats[rows[j - 1]])) {
-      rows[j] = rows[j - 1];
-      --j;
-    }
-    rows[j] = row;
-  }
-  return rows;
+constexpr std::size_t Slot(std::uint32_t key) noexcept {
+  return static_cast<std::size_t>((key * 0x9E3779B1u) >> 24);
 }
 
-constexpr std::uint32_t NameKey(const PixelFormatEntry& e) { return e.format.fourCC; }
-constexpr std::uint32_t WordKey(const PixelFormatEntry& e) { return e.format.properties.Word(); }
+constexpr std::uint32_t NameKey(const PixelFormatEntry& e) noexcept { return e.format.fourCC; }
+constexpr std::uint32_t WordKey(const PixelFormatEntry& e) noexcept {
+  return e.format.properties.Word();
+}
 
-constexpr RowIndex kRowsByName = SortedRows(NameKey);
-constexpr RowIndex kRowsByWord = SortedRows(WordKey);
-
-// The first row (in catalogue order) whose key equals `value`, or null.
 template <class Key>
-const PixelFormatEntry* FindFirst(const RowIndex& rows, Key key, std::uint32_t value) noexcept {
-  std::size_t lo = 0;
-  std::size_t hi = rows.size();
-  while (lo < hi) {
-    const std::size_t mid = lo + (hi - lo) / 2;
-    if (key(kBuiltInPixelFormats[rows[mid]]) < value) {
-      lo = mid + 1;
-    } else {
-      hi = mid;
+constexpr HashIndex BuildIndex(Key key) {
+  HashIndex index{};
+  for (std::size_t row = 0; row < kBuiltInPixelFormatCount; ++row) {
+    const std::uint32_t k = key(kBuiltInPixelFormats[row]);
+    std::size_t slot = Slot(k);
+    bool present = false;
+    while (index[slot] != 0 && !present) {
+      present = key(kBuiltInPixelFormats[index[slot] - 1]) == k;
+      if (!present) slot = (slot + 1) % kIndexSlots;
     }
+    if (!present) index[slot] = static_cast<std::uint8_t>(row + 1);
   }
-  if (lo == rows.size() || key(kBuiltInPixelFormats[rows[lo]]) != value) return nullptr;
-  return &kBuiltInPixelFormats[rows[lo]];
+  return index;
+}
+
+constexpr HashIndex kIndexByName = BuildIndex(NameKey);
+constexpr HashIndex kIndexByWord = BuildIndex(WordKey);
+
+// The first row (in catalogue order) whose key is `k`, or null. Terminates:
+// the index always has empty slots.
+template <class Key>
+const PixelFormatEntry* FindFirst(const HashIndex& index, Key key, std::uint32_t k) noexcept {
+  for (std::size_t slot = Slot(k);; slot = (slot + 1) % kIndexSlots) {
+    const std::uint8_t row = index[slot];
+    if (row == 0) return nullptr;
+    if (key(kBuiltInPixelFormats[row - 1]) == k) return &kBuiltInPixelFormats[row - 1];
+  }
+}
+
+constexpr std::size_t FilledSlots(const HashIndex& index) {
+  std::size_t filled = 0;
+  for (std::uint8_t row : index) filled += row != 0 ? 1 : 0;
+  return filled;
 }
 
 // The formats alone, contiguous, for AllPixelFormatsBegin/End.
@@ -217,13 +226,10 @@ constexpr bool CatalogueFactsHold() {
     if (name == kPixelFormatFourCC_Any || name == kPixelFormatFourCC_Invalid) return false;
     if (IsCustomPixelFormatName(name)) return false;
   }
-  for (std::size_t i = 1; i < kRowsByName.size(); ++i) {  // names are unique
-    if (NameKey(kBuiltInPixelFormats[kRowsByName[i - 1]]) ==
-        NameKey(kBuiltInPixelFormats[kRowsByName[i]])) {
-      return false;
-    }
-  }
-  return true;
+  // Names are unique; properties words are unique but for the four HLG rows,
+  // which share the HDR rows' words.
+  return FilledSlots(kIndexByName) == kBuiltInPixelFormatCount &&
+         FilledSlots(kIndexByWord) == kBuiltInPixelFormatCount - 4;
 }
 static_assert(CatalogueFactsHold());
 
@@ -244,7 +250,7 @@ CustomRegistry& Registry() {
 }  // namespace
 
 const PixelFormatEntry* FindBuiltInPixelFormat(std::uint32_t name) noexcept {
-  return FindFirst(kRowsByName, NameKey, name);
+  return FindFirst(kIndexByName, NameKey, name);
 }
 
 }  // namespace details
@@ -271,7 +277,7 @@ PixelFormatName GuessNameForProperties(PixelFormatProperties p) noexcept {
     return invalid;
   }
   const details::PixelFormatEntry* e =
-      details::FindFirst(details::kRowsByWord, details::WordKey, p.Word());
+      details::FindFirst(details::kIndexByWord, details::WordKey, p.Word());
   return e != nullptr ? e->format.fourCC : invalid;
 }
 

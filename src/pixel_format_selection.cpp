@@ -108,7 +108,7 @@ constexpr bool IsCustomOrSpecific(const PixelFormat& pf) noexcept {
   return IsCustomPixelFormatName(pf.fourCC) || pf.properties.IsSpecific();
 }
 
-constexpr bool IsSpecificBuiltInKind(const PixelFormat& pf) noexcept {
+constexpr bool IsSpecificNonCustom(const PixelFormat& pf) noexcept {
   return !IsCustomPixelFormatName(pf.fourCC) && pf.properties.IsSpecific();
 }
 
@@ -123,7 +123,7 @@ PixelFormat FirstFallback(const PixelFormatVector& list) noexcept {
     if (Is4444(pf.properties)) return pf;
   }
   for (const PixelFormat& pf : list) {
-    if (IsSpecificBuiltInKind(pf)) return pf;
+    if (IsSpecificNonCustom(pf)) return pf;
   }
   return kPixelFormat_Invalid;
 }
@@ -332,7 +332,7 @@ PixelFormat SelectNearestSourcePixelFormat(const PixelFormatVector& available,
   if (wanted.validity() == kPixelFormatValidity_Invalid) return kPixelFormat_Invalid;
   if (wanted.validity() == kPixelFormatValidity_Any) {
     for (const PixelFormat& a : available) {
-      if (IsSpecificBuiltInKind(a)) return a;
+      if (IsSpecificNonCustom(a)) return a;
     }
     return kPixelFormat_Invalid;
   }
