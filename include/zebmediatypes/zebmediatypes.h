@@ -26,5 +26,10 @@
 
 // Video formats: pixel formats, selection and sizing, aspect ratios,
 // descriptions.
+#include <zebmediatypes/pixel_aspect_ratio.h>
+#include <zebmediatypes/pixel_format.h>
+#include <zebmediatypes/pixel_format_selection.h>
+#include <zebmediatypes/render_quality.h>
+#include <zebmediatypes/video_descriptions.h>
 
 // Colour records and caches, RGBA, MIME constants, library lifecycle.
