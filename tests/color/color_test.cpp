@@ -548,16 +548,18 @@ TEST(ColorSpace, BadInputGivesTheDefaultColorSpace) {
   }
 }
 
-TEST(ColorSpace, InvalidUtf8NameIsKeptOrRejectedWhole) {
+TEST(ColorSpace, InvalidUtf8NameIsWrittenAsReplacementCharacters) {
   const ScopedStart started;
   const std::string kNames[] = {"\xFF", "\xC3", "\xED\xA0\x80", "ok\xE2\x82", "\xC0\xAF"};
   for (const std::string& name : kNames) {
     SCOPED_TRACE(name.size());
-    // Written: either a text that reads back as the space, or the default
-    // colour space's text in its place.
-    const ColorSpace space = MakeSpace(name, 2);
+    // The text stays valid JSON: the bad bytes become U+FFFD, the rest of the
+    // record is kept.
+    const ColorSpace space = MakeSpace(name, 2, true);
     const ColorSpace back = ColorSpaceFromSerializedString(space.ToSerializedString());
-    EXPECT_TRUE(back == space || back == DefaultSpace()) << Text(space);
+    const zebcore::UTF8String repaired =
+        zebcore::string::UTF16to8(zebcore::string::View(zebcore::string::UTF8to16(U8(name))));
+    EXPECT_EQ(back, MakeSpace(testing::Narrow(repaired), 2, true)) << Text(space);
     // Read: the bytes are taken as they stand or the read fails.
     const ColorSpace read =
         ReadSpace("{\"baseColorProfile\":{\"colorProfileName\":\"" + name + "\"}}");
