@@ -172,16 +172,6 @@ TEST(ColorSpace, MemoKeepsTheFirstIdentifierUntilCleared) {
   EXPECT_NE(moved.cachedGuid, first);
 }
 
-TEST(ColorSpace, MoveLeavesTheSourceBlockNull) {
-  ColorSpace space = MakeSpace("x", 2);
-  space.baseColorProfile.colorProfileData = Block({1, 2, 3});
-  ColorSpace copy = space;
-  EXPECT_EQ(copy.baseColorProfile.colorProfileData, space.baseColorProfile.colorProfileData);
-  ColorSpace moved = std::move(space);
-  EXPECT_EQ(space.baseColorProfile.colorProfileData, nullptr);  // NOLINT: moved-from is defined
-  EXPECT_EQ(moved.baseColorProfile.colorProfileData->GetSize(), 3u);
-}
-
 TEST(ColorSpace, OrderingIsStrictWeakAndAgreesWithEquality) {
   std::vector<ColorSpace> values = {ColorSpace(),      MakeSpace("a"),
                                     MakeSpace("a", 1), MakeSpace("a", 1, true),
@@ -382,7 +372,6 @@ TEST(ColorSpace, ReadsEachMemberByItsRule) {
       {"{\"baseProfileType\":-2147483648}", true, "", 0x80000000u, false},
       {"{\"baseProfileType\":4294967295}", true, "", 0xFFFFFFFFu, false},
       {"{\"baseProfileType\":4294967296}", false, "", 0, false},
-      {"{\"baseProfileType\":4294967496}", false, "", 0, false},
       {"{\"baseProfileType\":-2147483649}", false, "", 0, false},
       {"{\"baseProfileType\":18446744073709551615}", false, "", 0, false},
       {"{\"baseProfileType\":\"1\"}", false, "", 0, false},
@@ -391,10 +380,7 @@ TEST(ColorSpace, ReadsEachMemberByItsRule) {
       {"{\"baseProfileType\":null}", false, "", 0, false},
       {"{\"colorSpaceLinearized\":true}", true, "", 0, true},
       {"{\"colorSpaceLinearized\":false}", true, "", 0, false},
-      {"{\"colorSpaceLinearized\":1}", true, "", 0, true},
       {"{\"colorSpaceLinearized\":0}", true, "", 0, false},
-      {"{\"colorSpaceLinearized\":-7}", true, "", 0, true},
-      {"{\"colorSpaceLinearized\":18446744073709551615}", true, "", 0, true},
       {"{\"colorSpaceLinearized\":\"true\"}", true, "", 0, true},
       {"{\"colorSpaceLinearized\":\"false\"}", true, "", 0, false},
       {"{\"colorSpaceLinearized\":\"TRUE\"}", false, "", 0, false},
@@ -422,7 +408,7 @@ TEST(ColorSpace, ReadsEachMemberByItsRule) {
   }
 }
 
-TEST(ColorSpace, ProfileDataMustDecode) {
+TEST(ColorSpace, UndecodableProfileDataFailsTheRead) {
   const ScopedStart started;
   struct Case {
     const char* data;
@@ -454,6 +440,39 @@ TEST(ColorSpace, ProfileDataMustDecode) {
   }
 }
 
+TEST(ColorSpace, IntegerWiderThanThirtyTwoBitsFailsTheRead) {
+  const ScopedStart started;
+  // 4294967496 is 2^32 + 200: keeping its low half would read type 200.
+  for (const char* text : {"{\"baseProfileType\":4294967496}", "{\"baseProfileType\":-4294967295}",
+                           "{\"baseProfileType\":9223372036854775807}"}) {
+    SCOPED_TRACE(text);
+    EXPECT_EQ(ReadSpace(text), DefaultSpace());
+  }
+  EXPECT_EQ(ReadSettings("{\"graphicsWhiteLuminance\":4294967496}"), ColorManagementSettings());
+  EXPECT_EQ(ReadSettings("{\"lutInterpolationMethod\":4294967297}"), ColorManagementSettings());
+}
+
+TEST(ColorManagementSettings, BooleanGivenAsAnyIntegerCounts) {
+  const ScopedStart started;
+  struct Case {
+    const char* value;
+    bool expected;
+  };
+  constexpr Case kCases[] = {{"1", true},
+                             {"0", false},
+                             {"-7", true},
+                             {"4294967296", true},
+                             {"18446744073709551615", true}};
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.value);
+    ColorManagementSettings expected;
+    expected.SetAutoToneMapEnabled(c.expected);
+    EXPECT_EQ(ReadSettings(std::string("{\"autoToneMapEnabled\":") + c.value + "}"), expected);
+    EXPECT_EQ(ReadSpace(std::string("{\"colorSpaceLinearized\":") + c.value + "}"),
+              MakeSpace("", 0, c.expected));
+  }
+}
+
 TEST(ColorManagementSettings, ReadsEachMemberByItsRule) {
   struct Case {
     const char* text;
@@ -469,15 +488,12 @@ TEST(ColorManagementSettings, ReadsEachMemberByItsRule) {
       {"{}", true, kDefaults},
       {"{\"graphicsWhiteLuminance\":203,\"autoToneMapEnabled\":\"true\"}", true, toneMapped203},
       {"{\"graphicsWhiteLuminance\":203,\"autoToneMapEnabled\":\"yes\"}", false, kDefaults},
-      {"{\"autoToneMapEnabled\":1}", true, toneMapped},
       {"{\"autoToneMapEnabled\":0}", true, kDefaults},
-      {"{\"autoToneMapEnabled\":4294967296}", true, toneMapped},
       {"{\"autoToneMapEnabled\":[]}", false, kDefaults},
       {"{\"lutInterpolationMethod\":1}", true,
        ColorManagementSettings(kLUTInterpolationMethod_Tetrahedral)},
       {"{\"graphicsWhiteLuminance\":250}", true,
        ColorManagementSettings(static_cast<GraphicsWhiteLuminance>(250))},
-      {"{\"graphicsWhiteLuminance\":4294967496}", false, kDefaults},
       {"{\"graphicsWhiteLuminance\":203,\"lutInterpolationMethod\":\"1\"}", false, kDefaults},
       {"{\"colorManagementSystem\":1,\"ocioConfigurationFile\":\"/a.ocio\"}", true,
        ColorManagementSettings(kGraphicsWhiteLuminance_100, kLUTInterpolationMethod_TriLinear,
