@@ -3,6 +3,9 @@
 # Ticks and frame rates, ratio times, time displays, time ranges.
 target_sources(zebmediatypes PRIVATE
   tick_time.cpp
+  ratio_time.cpp
+  time_display.cpp
+  time_range.cpp
 )
 
 # Timecode text and the console commands.

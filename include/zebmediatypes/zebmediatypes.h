@@ -5,7 +5,10 @@
 #include <zebmediatypes/export.h>
 
 // Time: ticks and frame rates, ratio times, displays and timecode, ranges.
+#include <zebmediatypes/ratio_time.h>
 #include <zebmediatypes/tick_time.h>
+#include <zebmediatypes/time_display.h>
+#include <zebmediatypes/time_range.h>
 
 // Timecode text.
 

@@ -3,9 +3,13 @@
 // A library takes part in the host's start-up by owning one
 // InitializerRegistrar, built by a static initializer when the library loads.
 // The host calls StartUp() once when it starts, which calls every registered
-// initialize function in registration order, and ShutDown() when it stops,
-// which calls the terminate functions of those that started, in reverse order.
-// A registrar destroyed while started (its library unloads) is terminated first.
+// initialize function in registration order (a registrar whose named
+// dependencies are registered waits until they have started), and ShutDown()
+// when it stops, which calls the terminate functions of those that started, in
+// reverse order of starting. A registrar destroyed while started (its library
+// unloads) is terminated first. The functions are called without any registry
+// lock held, so they may use every other service, but they must not call
+// StartUp or ShutDown themselves.
 #pragma once
 
 #include <cstddef>
@@ -51,11 +55,14 @@ class ZEBCORE_API InitializerRegistrar {
   EInitializerContextFlags context_;
   InitializeFunction initialize_;
   TerminateFunction terminate_;
+  const char* dependencies_[kMaxInitializerDependencies] = {};
   bool started_ = false;
 };
 
 // Calls every registered initialize function not yet started, in registration
-// order. True when all of them returned true.
+// order. True when all of them returned true. A registrar whose initialize
+// function returns false (or is null) is not started, is not terminated, and is
+// tried again by the next StartUp; so is one whose dependency did not start.
 ZEBCORE_API bool StartUp();
 // Calls the terminate function of every started registrar, newest first.
 ZEBCORE_API void ShutDown();

@@ -25,6 +25,12 @@ class ZEBCORE_API UTF16OStream {
   UTF16OStream& operator<<(const UTF16String& text) { Write(View(text)); return *this; }
   UTF16OStream& operator<<(const char16_t* text) { Write(std::u16string_view(text)); return *this; }
   UTF16OStream& operator<<(char16_t c) { Write(std::u16string_view(&c, 1)); return *this; }
+  // A narrow character is a character, not a number: ' ' writes a space. Bytes
+  // above 0x7F (parts of a UTF-8 sequence) become U+FFFD.
+  UTF16OStream& operator<<(char c) {
+    const auto b = static_cast<unsigned char>(c);
+    return *this << (b < 0x80 ? static_cast<char16_t>(b) : u'\uFFFD');
+  }
   // Narrow text is taken as UTF-8.
   UTF16OStream& operator<<(std::string_view utf8);
   UTF16OStream& operator<<(const char* utf8) { return *this << std::string_view(utf8); }

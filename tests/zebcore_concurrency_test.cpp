@@ -1,0 +1,133 @@
+// zebcore services used from several threads at once.
+
+#include <gtest/gtest.h>
+#include <zebcore/assert.h>
+#include <zebcore/console.h>
+#include <zebcore/localizer.h>
+#include <zebcore/logging.h>
+#include <zebcore/mutex.h>
+
+#include <atomic>
+#include <chrono>
+#include <string>
+#include <thread>
+#include <vector>
+
+namespace {
+
+using zebcore::UTF16String;
+
+TEST(RecursiveMutex, LockTimesOutWhileAnotherThreadHoldsIt) {
+  zebcore::threads::RecursiveMutex mutex("held");
+  std::atomic<bool> held{false};
+  std::atomic<bool> release{false};
+  std::thread holder([&] {
+    ASSERT_TRUE(mutex.Lock("holder", 1000));
+    held = true;
+    while (!release) std::this_thread::sleep_for(std::chrono::milliseconds(1));
+    mutex.Unlock();
+  });
+  while (!held) std::this_thread::sleep_for(std::chrono::milliseconds(1));
+
+  std::vector<std::string> traced;
+  zebcore::logging::SetTraceSink(
+      [&](std::string_view, int, std::string_view text) { traced.emplace_back(text); }, 1);
+  EXPECT_FALSE(mutex.Lock("waiter", 20));
+  {
+    zebcore::threads::RecursiveLockGuard guard(mutex, "guard", 0);
+    EXPECT_FALSE(guard);
+  }
+  zebcore::logging::SetTraceSink({}, 0);
+  ASSERT_EQ(traced.size(), 2u);
+  EXPECT_NE(traced[0].find("waiter"), std::string::npos);
+  EXPECT_NE(traced[0].find("held"), std::string::npos);
+
+  release = true;
+  holder.join();
+  EXPECT_TRUE(mutex.Lock("after", 1000));  // free again
+  mutex.Unlock();
+}
+
+TEST(RecursiveMutex, SerializesHolders) {
+  zebcore::threads::RecursiveMutex mutex;
+  long counter = 0;
+  std::vector<std::thread> threads;
+  for (int t = 0; t < 4; ++t) {
+    threads.emplace_back([&] {
+      for (int i = 0; i < 1000; ++i) {
+        zebcore::threads::RecursiveLockGuard outer(mutex, "outer", 60000);
+        zebcore::threads::RecursiveLockGuard inner(mutex, "inner", 60000);
+        ++counter;
+      }
+    });
+  }
+  for (auto& t : threads) t.join();
+  EXPECT_EQ(counter, 4000);
+}
+
+TEST(ScopedAssertionCapture, CapturesReportsFromOtherThreads) {
+  zebcore::debug::ScopedAssertionCapture capture;
+  std::vector<std::thread> threads;
+  for (int t = 0; t < 4; ++t) {
+    threads.emplace_back([] {
+      for (int i = 0; i < 100; ++i) {
+        zebcore::debug::ReportAssertion("x", "from a thread", __FILE__, "worker", __LINE__);
+      }
+    });
+  }
+  for (auto& t : threads) t.join();
+  EXPECT_EQ(capture.Count(), 400u);
+  EXPECT_EQ(capture.LastMessage(), "from a thread");
+}
+
+class Nop final : public zebcore::console::Command {
+ public:
+  void Execute(const UTF16String&, zebcore::string::UTF16OStream& out) override { out << u"."; }
+};
+
+TEST(CommandRegistry, StaysConsistentUnderConcurrentUse) {
+  auto& registry = zebcore::console::CommandRegistry::Get();
+  std::atomic<int> registered{0};
+  std::vector<std::thread> threads;
+  for (int t = 0; t < 4; ++t) {
+    threads.emplace_back([&, t] {
+      for (int i = 0; i < 200; ++i) {
+        // Every thread races for the same few names.
+        const UTF16String name =
+            u"zebcore.race." + UTF16String(1, static_cast<char16_t>(u'a' + i % 5));
+        if (registry.RegisterCommand(name, u"", [] { return std::make_shared<Nop>(); })) {
+          ++registered;
+        }
+        zebcore::string::oUTF16StringStream out;
+        registry.Execute(name, u"", out);
+        if (registry.UnregisterCommand(name)) --registered;
+        (void)registry.Commands();
+        (void)t;
+      }
+    });
+  }
+  for (auto& t : threads) t.join();
+  EXPECT_EQ(registered.load(), 0);
+  for (const auto& entry : registry.Commands()) {
+    EXPECT_NE(entry.name.rfind(u"zebcore.race.", 0), 0u);
+  }
+}
+
+TEST(Localizer, ReadsWhileTranslationsChange) {
+  auto& localizer = zebcore::config::Localizer::Get();
+  std::atomic<bool> stop{false};
+  std::thread writer([&] {
+    for (int i = 0; i < 200; ++i) {
+      localizer.InstallTranslations({{"$$$/a/b", u"T"}});
+      localizer.ClearTranslations();
+    }
+    stop = true;
+  });
+  while (!stop) {
+    const UTF16String text = localizer.Localize("$$$/a/b=D");
+    EXPECT_TRUE(text == UTF16String(u"T") || text == UTF16String(u"D"));
+  }
+  writer.join();
+}
+
+}  // namespace

@@ -1,0 +1,341 @@
+// JSON text and the boost::any value model.
+
+#include <gtest/gtest.h>
+#include <zebcore/assert.h>
+#include <zebcore/json.h>
+
+#include <cfloat>
+#include <cmath>
+#include <cstdint>
+#include <cstring>
+#include <limits>
+#include <random>
+#include <string>
+
+namespace {
+
+using zebcore::UTF8String;
+using namespace zebcore::serialization;
+
+JSONValue Parse(const std::string& text) {
+  return JSONParse(reinterpret_cast<const unsigned char*>(text.data()), text.size());
+}
+
+std::string Print(const boost::any& value, bool pretty = false) {
+  return zebcore::string::ToStdString(GetJSONUTF8String(value, pretty));
+}
+
+UTF8String U8(const char* s) { return zebcore::string::ToUTF8String(s); }
+
+TEST(JSONParse, GivesEachValueItsType) {
+  struct Case {
+    const char* text;
+    const std::type_info& type;
+  };
+  const Case kCases[] = {
+      {"{}", typeid(JSONObject)},
+      {"[]", typeid(JSONArray)},
+      {"0", typeid(std::int64_t)},
+      {"-0", typeid(std::int64_t)},
+      {"9223372036854775807", typeid(std::int64_t)},
+      {"-9223372036854775808", typeid(std::int64_t)},
+      {"9223372036854775808", typeid(std::uint64_t)},
+      {"18446744073709551615", typeid(std::uint64_t)},
+      {"1.5", typeid(double)},
+      {"1e2", typeid(double)},
+      {"-0.0", typeid(double)},
+      {"true", typeid(bool)},
+      {"false", typeid(bool)},
+      {"\"text\"", typeid(UTF8String)},
+      {" \t\r\n 7 \n", typeid(std::int64_t)},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.text);
+    const JSONValue value = Parse(c.text);
+    ASSERT_TRUE(value);
+    EXPECT_EQ(value->type(), c.type);
+  }
+  const JSONValue null = Parse("null");
+  ASSERT_TRUE(null);  // a document that is JSON null is not a failure
+  EXPECT_TRUE(null->empty());
+}
+
+TEST(JSONParse, KeepsIntegersExact) {
+  EXPECT_EQ(boost::any_cast<std::int64_t>(*Parse("-9223372036854775808")),
+            std::numeric_limits<std::int64_t>::min());
+  EXPECT_EQ(boost::any_cast<std::uint64_t>(*Parse("18446744073709551615")),
+            std::numeric_limits<std::uint64_t>::max());
+  EXPECT_EQ(boost::any_cast<std::int64_t>(*Parse("254016000000")), 254016000000);
+}
+
+TEST(JSONParse, RejectsMalformedText) {
+  const std::string kCases[] = {
+      "",
+      " ",
+      "{",
+      "}",
+      "[1,",
+      "[1,]",
+      "{\"a\":}",
+      "{\"a\" 1}",
+      "{\"a\":1,}",
+      "{a:1}",
+      "{'a':1}",
+      "tru",
+      "nul",
+      "True",
+      "01",
+      "1.",
+      ".5",
+      "+1",
+      "0x10",
+      "NaN",
+      "Infinity",
+      "-Infinity",
+      "\"unterminated",
+      "\"bad \\x escape\"",
+      "\"\\u12\"",
+      "\"\\ud800\"",  // a lone surrogate escape
+      "\"\\udc00\\ud800\"",
+      "\"a\x01z\"",  // a raw control character
+      "\"\xFF\"",    // invalid UTF-8
+      "\"\xC3\"",
+      "\"\xED\xA0\x80\"",  // an encoded surrogate
+      "[1] [2]",           // two documents
+      "{} x",
+      "/* comment */ 1",
+      "[1 2]",
+  };
+  for (const std::string& text : kCases) {
+    SCOPED_TRACE(::testing::PrintToString(text));
+    EXPECT_FALSE(Parse(text));
+  }
+}
+
+TEST(JSONParse, RejectsNumbersOutsideTheirRanges) {
+  const char* const kCases[] = {
+      "18446744073709551616",
+      "-9223372036854775809",
+      "123456789012345678901234567890",
+      "-123456789012345678901234567890",
+      "[1, 99999999999999999999]",
+      "{\"ticks\": 1000000000000000000000000}",
+      "1e400",
+      "-1e400",
+      "[1.7976931348623159e308]",
+  };
+  for (const char* text : kCases) {
+    SCOPED_TRACE(text);
+    EXPECT_FALSE(Parse(text));
+  }
+  // Tiny numbers underflow towards zero; they are numbers.
+  const JSONValue tiny = Parse("1e-400");
+  ASSERT_TRUE(tiny);
+  EXPECT_EQ(boost::any_cast<double>(*tiny), 0.0);
+}
+
+TEST(JSONParse, LimitsNesting) {
+  for (const char* open : {"[", "{\"k\":"}) {
+    const char* close = open[0] == '[' ? "]" : "}";
+    auto nested = [&](std::size_t depth) {
+      std::string text;
+      for (std::size_t i = 0; i < depth; ++i) text += open;
+      text += "1";
+      for (std::size_t i = 0; i < depth; ++i) text += close;
+      return text;
+    };
+    SCOPED_TRACE(open);
+    const JSONValue deepest = Parse(nested(kMaxJSONDepth));
+    ASSERT_TRUE(deepest);
+    {
+      // The deepest readable document prints whole and reads back.
+      zebcore::debug::ScopedAssertionCapture capture;
+      EXPECT_EQ(Print(*deepest), nested(kMaxJSONDepth));
+      EXPECT_EQ(capture.Count(), 0u);
+    }
+    EXPECT_FALSE(Parse(nested(kMaxJSONDepth + 1)));
+    EXPECT_FALSE(Parse(nested(100000)));
+    EXPECT_FALSE(Parse(std::string(1000000, open[0])));  // never closed
+  }
+}
+
+TEST(JSONParse, RejectsEveryTruncation) {
+  const std::string text =
+      "{\"a\":[1,-2,3.5e1,true,false,null,\"s\\n\\u00e9\\ud83c\\udfac\"],\"b\":{\"c\":{}}}";
+  ASSERT_TRUE(Parse(text));
+  for (std::size_t n = 0; n < text.size(); ++n) {
+    SCOPED_TRACE(n);
+    // An exact-size copy, so a read past the end shows under the sanitizers.
+    std::unique_ptr<unsigned char[]> exact(new unsigned char[n + 1]);
+    std::memcpy(exact.get(), text.data(), n);
+    EXPECT_FALSE(JSONParse(exact.get(), n));
+  }
+}
+
+TEST(JSONParse, AZeroByteEndsTheText) {
+  const std::string withTerminator("{\"a\":1}\0", 8);
+  EXPECT_TRUE(Parse(withTerminator));
+  EXPECT_TRUE(Parse(std::string("[2]\0garbage", 11)));
+  EXPECT_FALSE(Parse(std::string("{\"a\"\0:1}", 8)));
+  EXPECT_FALSE(Parse(std::string("\0{}", 3)));
+  EXPECT_FALSE(JSONParse(nullptr, 10));
+}
+
+TEST(JSONParse, RepeatedKeyKeepsTheLastValue) {
+  const JSONValue value = Parse("{\"a\":1,\"a\":2}");
+  ASSERT_TRUE(value);
+  std::int64_t a = 0;
+  ASSERT_TRUE(GetJSONInt64(*GetVariantInObject(*value, "a"), a));
+  EXPECT_EQ(a, 2);
+}
+
+TEST(GetJSONUTF8String, WritesCompactTextInKeyOrder) {
+  boost::any object;
+  AddToObject(object, "zebra", std::int64_t{-5}, false);
+  AddToObject(object, "alpha", true, false);
+  AddToObject(object, "mid", U8("q\"\\/\b\f\n\r\t\x01\x1F\xC3\xA9"), false);
+  AddToObject(object, "num", 0.1, false);
+  AddToObject(object, "whole", 25.0, false);
+  AddToObject(object, "big", std::numeric_limits<std::uint64_t>::max(), false);
+  AddToObject(object, "none", boost::any(), false);
+  boost::any array = JSONArray{std::make_shared<boost::any>(std::int64_t{1}),
+                               std::make_shared<boost::any>(JSONObject()),
+                               std::make_shared<boost::any>(JSONArray())};
+  AddToObject(object, "list", array, false);
+  EXPECT_EQ(Print(object),
+            "{\"alpha\":true,\"big\":18446744073709551615,\"list\":[1,{},[]],"
+            "\"mid\":\"q\\\"\\\\/\\b\\f\\n\\r\\t\\u0001\\u001f\xC3\xA9\",\"none\":null,"
+            "\"num\":0.1,\"whole\":25.0,\"zebra\":-5}");
+}
+
+TEST(GetJSONUTF8String, WritesValidTextForAnyValue) {
+  struct Case {
+    boost::any value;
+    const char* text;
+  };
+  const Case kCases[] = {
+      {std::numeric_limits<double>::quiet_NaN(), "null"},  // JSON has no NaN
+      {HUGE_VAL, "null"},
+      {std::numeric_limits<std::int64_t>::min(), "-9223372036854775808"},
+      {U8("bad \xFF\xC3 utf8"), "\"bad \xEF\xBF\xBD\xEF\xBF\xBD utf8\""},
+      {std::string("narrow"), "\"narrow\""},
+      {42, "42"},
+      {1.5f, "1.5"},
+      {JSONValue(), "null"},
+      {std::make_shared<boost::any>(std::int64_t{3}), "3"},
+      {std::vector<int>{1}, "null"},  // not a JSON type
+      {1e300, "1e+300"},
+      {-0.0, "-0.0"},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.text);
+    const std::string text = Print(c.value);
+    EXPECT_EQ(text, c.text);
+    EXPECT_TRUE(Parse(text));
+  }
+}
+
+TEST(GetJSONUTF8String, AValueThatContainsItselfPrintsAndReports) {
+  auto self = std::make_shared<boost::any>(JSONArray());
+  boost::any_cast<JSONArray>(self.get())->push_back(self);
+  zebcore::debug::ScopedAssertionCapture capture;
+  const std::string text = Print(*self);
+  EXPECT_EQ(capture.Count(), 1u);
+  EXPECT_TRUE(Parse(text));
+  boost::any_cast<JSONArray>(self.get())->clear();  // break the cycle
+}
+
+TEST(GetJSONUTF8String, PrintedTextParsesToTheSameText) {
+  const char* const kCases[] = {
+      "{\"b\":[1,2,{\"c\":null}],\"a\":\"\\u00e9\\ud83c\\udfac\\u0000x\"}",
+      "[0.1,-2.5e-300,1.7976931348623157e308,4.9e-324,12345678901234567890,-1]",
+      "{\"\":{\"\":[]},\"\\\"\":true}",
+      "\"\\/\\b\\f\\n\\r\\t\"",
+  };
+  for (const char* text : kCases) {
+    SCOPED_TRACE(text);
+    const JSONValue first = Parse(text);
+    ASSERT_TRUE(first);
+    const std::string printed = Print(*first);
+    const JSONValue second = Parse(printed);
+    ASSERT_TRUE(second);
+    EXPECT_EQ(Print(*second), printed);
+    const JSONValue pretty = Parse(Print(*first, true));
+    ASSERT_TRUE(pretty);
+    EXPECT_EQ(Print(*pretty), printed);
+  }
+}
+
+TEST(GetJSONUTF8String, DoublesRoundTripBitForBit) {
+  std::mt19937_64 random(99);
+  for (int i = 0; i < 20000; ++i) {
+    std::uint64_t bits = random();
+    double value;
+    std::memcpy(&value, &bits, sizeof value);
+    if (!std::isfinite(value)) continue;
+    const std::string text = Print(value);
+    SCOPED_TRACE(text);
+    const JSONValue back = Parse(text);
+    ASSERT_TRUE(back);
+    ASSERT_EQ(back->type(), typeid(double));
+    const double parsed = boost::any_cast<double>(*back);
+    EXPECT_EQ(std::memcmp(&parsed, &value, sizeof value), 0);
+  }
+}
+
+TEST(GetJSONUTF8String, PrettyTextIndentsMembers) {
+  boost::any object;
+  AddToObject(object, "a", std::int64_t{1}, false);
+  AddToObject(object, "b", JSONArray{std::make_shared<boost::any>(true)}, false);
+  EXPECT_EQ(Print(object, true), "{\n  \"a\": 1,\n  \"b\": [\n    true\n  ]\n}");
+}
+
+TEST(AddToObject, ReplacesOnlyWhenAsked) {
+  boost::any object;  // empty: becomes an object
+  EXPECT_TRUE(AddToObject(object, "k", std::int64_t{1}, false));
+  EXPECT_FALSE(AddToObject(object, "k", std::int64_t{2}, false));
+  std::int64_t k = 0;
+  ASSERT_TRUE(GetJSONInt64(*GetVariantInObject(object, "k"), k));
+  EXPECT_EQ(k, 1);
+  EXPECT_TRUE(AddToObject(object, U8("k"), std::int64_t{3}, true));
+  ASSERT_TRUE(GetJSONInt64(*GetVariantInObject(object, "k"), k));
+  EXPECT_EQ(k, 3);
+  EXPECT_TRUE(ObjectHasProperty(object, "k"));
+  EXPECT_FALSE(ObjectHasProperty(object, "K"));
+  EXPECT_FALSE(GetVariantInObject(object, "missing"));
+}
+
+TEST(AddToObject, RefusesAValueThatIsNoObject) {
+  boost::any number = std::int64_t{5};
+  zebcore::debug::ScopedAssertionCapture capture;
+  EXPECT_FALSE(AddToObject(number, "k", true, false));
+  EXPECT_EQ(capture.Count(), 1u);
+  EXPECT_EQ(boost::any_cast<std::int64_t>(number), 5);
+  EXPECT_FALSE(ObjectHasProperty(number, "k"));
+  EXPECT_FALSE(GetVariantInObject(number, "k"));
+}
+
+TEST(GetJSONInt64, ReadsOnlyIntegersThatFit) {
+  struct Case {
+    boost::any value;
+    bool ok;
+    std::int64_t expected;
+  };
+  const Case kCases[] = {
+      {std::int64_t{-7}, true, -7},
+      {std::uint64_t{9223372036854775807ULL}, true, std::numeric_limits<std::int64_t>::max()},
+      {std::uint64_t{9223372036854775808ULL}, false, 0},
+      {1.0, false, 0},
+      {true, false, 0},
+      {U8("1"), false, 0},
+      {boost::any(), false, 0},
+  };
+  for (std::size_t i = 0; i < std::size(kCases); ++i) {
+    SCOPED_TRACE(i);
+    std::int64_t out = 0;
+    EXPECT_EQ(GetJSONInt64(kCases[i].value, out), kCases[i].ok);
+    EXPECT_EQ(out, kCases[i].expected);
+  }
+}
+
+}  // namespace
