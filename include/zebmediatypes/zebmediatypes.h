@@ -33,3 +33,10 @@
 #include <zebmediatypes/video_descriptions.h>
 
 // Colour records and caches, RGBA, MIME constants, library lifecycle.
+#include <zebmediatypes/color/color_management_settings.h>
+#include <zebmediatypes/color/color_profile.h>
+#include <zebmediatypes/color/color_serialization.h>
+#include <zebmediatypes/color/color_space.h>
+#include <zebmediatypes/color/rgba.h>
+#include <zebmediatypes/initialization.h>
+#include <zebmediatypes/mime_types.h>
