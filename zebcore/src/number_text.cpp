@@ -204,20 +204,22 @@ bool StringToNumber(std::u16string_view text, double& value) {
     negative = narrow[i] == '-';
     ++i;
   }
+  auto skipDigits = [&] {
+    const std::size_t start = i;
+    while (i < n && narrow[i] >= '0' && narrow[i] <= '9') ++i;
+    return i - start;
+  };
   const std::size_t numberStart = i;
-  std::size_t mantissaDigits = 0;
-  while (i < n && narrow[i] >= '0' && narrow[i] <= '9') ++i, ++mantissaDigits;
+  std::size_t mantissaDigits = skipDigits();
   if (i < n && narrow[i] == '.') {
     ++i;
-    while (i < n && narrow[i] >= '0' && narrow[i] <= '9') ++i, ++mantissaDigits;
+    mantissaDigits += skipDigits();
   }
   if (mantissaDigits == 0) return false;
   if (i < n && (narrow[i] == 'e' || narrow[i] == 'E')) {
     ++i;
     if (i < n && (narrow[i] == '+' || narrow[i] == '-')) ++i;
-    std::size_t exponentDigits = 0;
-    while (i < n && narrow[i] >= '0' && narrow[i] <= '9') ++i, ++exponentDigits;
-    if (exponentDigits == 0) return false;
+    if (skipDigits() == 0) return false;
   }
   if (i != n) return false;
 
