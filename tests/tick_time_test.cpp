@@ -326,6 +326,52 @@ TEST(TickTime, AlignmentPropertiesHoldAcrossASweep) {
   }
 }
 
+// Reference alignment in 128-bit arithmetic, written from the rules rather
+// than from the 64-bit code: floor toward zero, ceiling by t + p - 1, nearest
+// with the half away from zero, then the clamp.
+struct WideReference {
+  using Wide = __int128;
+  static Wide TowardZero(Wide u, Wide p) { return u - u % p; }
+  static std::int64_t Floor(std::int64_t t, std::int64_t p) {
+    return static_cast<std::int64_t>(TowardZero(t, p));
+  }
+  static std::int64_t Ceil(std::int64_t t, std::int64_t p) {
+    const Wide r = TowardZero(Wide{t} + p - 1, p);
+    const Wide kLast = kInt64Max - kInt64Max % p;  // last representable boundary
+    return static_cast<std::int64_t>(r > kInt64Max ? kLast : r);
+  }
+  static std::int64_t Nearest(std::int64_t t, std::int64_t p) {
+    const Wide h = p / 2;
+    Wide r = TowardZero(t >= 0 ? Wide{t} + h : Wide{t} - h, p);
+    if (r > kTime_Max.GetTicks()) r = kTime_Max.GetTicks();
+    if (r < kTime_Min.GetTicks()) r = kTime_Min.GetTicks();
+    return static_cast<std::int64_t>(r);
+  }
+};
+
+TEST(TickTime, AlignmentAgreesWithWideArithmetic) {
+  std::uint64_t state = 0x9E3779B97F4A7C15u;
+  auto next = [&state] {  // splitmix64
+    std::uint64_t z = (state += 0x9E3779B97F4A7C15u);
+    z = (z ^ (z >> 30)) * 0xBF58476D1CE4E5B9u;
+    z = (z ^ (z >> 27)) * 0x94D049BB133111EBu;
+    return z ^ (z >> 31);
+  };
+  for (int i = 0; i < 20000; ++i) {
+    const std::uint64_t r = next();
+    // Rates from 1 tick to near INT64_MAX, times anywhere in the 64-bit range.
+    std::int64_t p = static_cast<std::int64_t>(next() >> (1 + r % 63));
+    if (p <= 0 || p == kInt64Max) p = 1;
+    const std::int64_t t =
+        static_cast<std::int64_t>(r >> (next() % 64)) * ((next() & 1) != 0 ? -1 : 1);
+    SCOPED_TRACE(testing::Message() << t << " / " << p);
+    TickTime floor(t), ceil(t), nearest(t);
+    EXPECT_EQ(floor.AlignToFrame(FrameRate(p)).GetTicks(), WideReference::Floor(t, p));
+    EXPECT_EQ(ceil.AlignToFrameCeil(FrameRate(p)).GetTicks(), WideReference::Ceil(t, p));
+    EXPECT_EQ(nearest.AlignToNearestFrame(FrameRate(p)).GetTicks(), WideReference::Nearest(t, p));
+  }
+}
+
 TEST(TickTime, CalculateFrameRate) {
   struct Case {
     const char* label;
