@@ -547,6 +547,10 @@ TEST(Timecode, FormatAndReadAreInversesAroundZeroBoundariesAndAcrossTheDay) {
       // A prime stride across [-1 h, +24 h).
       Sweep(c, -3600 * perSecond, end, perSecond > 1000 ? 1000003 : 997, extra);
     }
+    // Trimmed and widened texts with colons read back too.
+    Sweep(
+        c, -3600 * perSecond, end, perSecond > 1000 ? 1000003 : 997,
+        kTimecodeFlag_TrimLeadingZeros | kTimecodeFlag_KeepMinutes | kTimecodeFlag_ColonSeparators);
     // Either side of every drop-frame ten-minute boundary.
     if (c.display.IsDropFrame()) {
       const std::int64_t tenMinutes =
