@@ -114,6 +114,7 @@ struct Fields {
   std::uint64_t seconds = 0;
   std::uint64_t frames = 0;
   bool negative = false;
+  std::uint64_t framesPerSecond = 0;  // of the display
 };
 
 // The fields of an hours:minutes:seconds:frames display (every display but the
@@ -136,6 +137,7 @@ Fields ComputeFields(std::int64_t ticks, FrameRate rate, TimeDisplay display) {
       minutes += k;
       c -= k * n.otherMinuteFrames;
     }
+    out.framesPerSecond = static_cast<std::uint64_t>(n.labelsPerSecond);
     out.minutes = static_cast<std::uint64_t>(minutes);
     out.seconds = static_cast<std::uint64_t>(c / n.labelsPerSecond);
     out.frames = static_cast<std::uint64_t>(c % n.labelsPerSecond);
@@ -153,11 +155,21 @@ Fields ComputeFields(std::int64_t ticks, FrameRate rate, TimeDisplay display) {
     a = Magnitude(c);
     f = DisplayFramesPerSecond(display, rate);
   }
-  out.hours = (a / (3600 * f)) % 24;
-  out.minutes = (a % (3600 * f)) / (60 * f);
-  out.seconds = (a % (60 * f)) / f;
-  out.frames = a % f;
+  // One division by the display count; the rest are by constants.
+  const std::uint64_t totalSeconds = a / f;
+  out.framesPerSecond = f;
+  out.frames = a - totalSeconds * f;
+  out.hours = (totalSeconds / 3600) % 24;
+  out.minutes = (totalSeconds / 60) % 60;
+  out.seconds = totalSeconds % 60;
   return out;
+}
+
+// Digits of the frame field: those of the largest frame label, f - 1.
+std::size_t FrameFieldWidth(std::uint64_t framesPerSecond) noexcept {
+  std::size_t width = 1;
+  for (std::uint64_t largest = framesPerSecond - 1; largest >= 10; largest /= 10) ++width;
+  return width;
 }
 
 // A short ASCII text built in place and widened once at the end.
@@ -223,8 +235,7 @@ void FormatHMSF(TextBuffer& text, std::int64_t ticks, FrameRate rate, TimeDispla
   }
   text.PutUnsigned(fields.seconds, !trim || written ? 2 : 1);
   text.Put(display.GetType() == kTimeDisplay_AudioMsTimecode ? '.' : separator);
-  text.PutUnsigned(fields.frames,
-                   static_cast<std::size_t>(GetTimeDisplayFrameStringWidth(display, rate)));
+  text.PutUnsigned(fields.frames, FrameFieldWidth(fields.framesPerSecond));
 
   // Widening to minutes: only a text with one non-digit (seconds and frames,
   // no sign) is widened, and with the field separator even when the one

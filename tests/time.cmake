@@ -10,6 +10,8 @@ zmt_add_test(time_values_test SOURCES
 
 # Timecode text and the console commands.
 zmt_add_test(zebmediatypes_timecode_tests SOURCES timecode_test.cpp time_commands_test.cpp)
+zmt_add_test(zebmediatypes_time_commands_concurrency_tests
+             SOURCES time_commands_concurrency_test.cpp CONCURRENT)
 if(TARGET zebmediatypes-console)
   # The console program run on real input: exit codes, help, one command from
   # the command line, lines from standard input until "quit".

@@ -40,29 +40,10 @@ struct Case {
   const char* line;
 };
 
-TEST_F(TimeCommandsTest, RegistersBothCommandsWithTheirHelpAndUnregistersThem) {
+TEST_F(TimeCommandsTest, RegisterAndUnregisterBothCommands) {
   auto& registry = zebcore::console::CommandRegistry::Get();
-  ASSERT_TRUE(registry.HasCommand(TimeToTimecode::kName));
-  ASSERT_TRUE(registry.HasCommand(TimecodeToTime::kName));
-  int found = 0;
-  for (const auto& entry : registry.Commands()) {
-    if (entry.name == TimeToTimecode::kName) {
-      ++found;
-      EXPECT_EQ(Narrow(entry.help),
-                "zebmediatypes.TimeToTimecode [-s] <time> <source_fps> <display_fps> [-d]- This "
-                "command will convert a time in frames to a timecode and print it. Time will be "
-                "interpreted as seconds if -s is specified before the time. Time display will use "
-                "drop frame if -d is specified after display_fps");
-    } else if (entry.name == TimecodeToTime::kName) {
-      ++found;
-      EXPECT_EQ(Narrow(entry.help),
-                "zebmediatypes.TimecodeToTime <timecode> <source_fps> <display_fps> [-d]- This "
-                "command will convert a timecode string to a time in seconds and frames and print "
-                "it. <timecode> should be in HH:MM:SS:FF format. Time display will use drop frame "
-                "if -d is specified after display_fps");
-    }
-  }
-  EXPECT_EQ(found, 2);
+  EXPECT_TRUE(registry.HasCommand(TimeToTimecode::kName));
+  EXPECT_TRUE(registry.HasCommand(TimecodeToTime::kName));
   UnregisterTimeCommands();
   EXPECT_FALSE(registry.HasCommand(TimeToTimecode::kName));
   EXPECT_FALSE(registry.HasCommand(TimecodeToTime::kName));

@@ -87,10 +87,10 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   std::memcpy(&ticks, data, size < sizeof ticks ? size : sizeof ticks);
   const zebcore::UTF16String written =
       media::TimeToTimecode(media::TickTime(ticks), rate, display, flags);
-  // Within 2^62 ticks (far beyond the +-100 hours the library produces), for
-  // rates of at most 2^61 ticks a frame, and where a labelled day of the
-  // display fits in 2^62 ticks, moving by a frame cannot leave 64 bits and
-  // the text must read.
+  // For times nearer zero than kTime_Invalid (400000 s, far beyond the
+  // +-100 hours the library produces), rates of at most 2^61 ticks a frame, and
+  // displays whose labelled day fits in 2^62 ticks, nothing leaves 64 bits and
+  // what is read lies nearer zero than kTime_Invalid too: the text must read.
   const media::FrameRate nominal = media::GetFrameRateForTimeDisplay(display, rate);
   const double longestFrame =
       static_cast<double>(std::max(rate.IsValid() ? rate.GetTicksPerFrame() : 0,
@@ -98,7 +98,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   const double labelledDay =
       86400.0 * static_cast<double>(display.GetDisplayFramesPerSecond(rate)) * longestFrame;
   constexpr double kLimit = 4611686018427387904.0;  // 2^62
-  const bool inRange = ticks >= -(std::int64_t{1} << 62) && ticks <= (std::int64_t{1} << 62) &&
+  const std::int64_t bound = -media::kTime_Invalid.GetTicks();
+  const bool inRange = ticks > -bound && ticks < bound &&
                        (rate.GetTicksPerFrame() <= (std::int64_t{1} << 61) || !rate.IsValid()) &&
                        labelledDay <= kLimit;
   if (inRange && media::TimecodeToTime(written, rate, display, flags) == media::kTime_Invalid) {
