@@ -1,5 +1,6 @@
 // Label pairing and the layout comparison, remapping and relabelling functions.
 #include <zebmediatypes/audio_channel_layout.h>
+#include <zebmediatypes/audio_format.h>
 
 #include <algorithm>
 #include <array>
@@ -145,6 +146,12 @@ bool ContainsSameChannelsIgnoreOrder(const AudioChannelLayout& a, const AudioCha
 
 void NormalizeChannelOrder(AudioChannelLayout& layout) noexcept {
   std::sort(layout.begin(), layout.end());
+}
+
+void NormalizeChannelOrder(AudioFormat& format) {
+  AudioChannelLayout layout = format.GetChannelLayout();
+  NormalizeChannelOrder(layout);
+  format.SetChannelLayout(layout);
 }
 
 bool RemapChannelOrdering(const AudioChannelLayout& source, const AudioChannelLayout& destination,

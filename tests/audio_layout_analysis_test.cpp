@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 #include <zebmediatypes/audio_channel_layout.h>
+#include <zebmediatypes/audio_format.h>
 
 #include <algorithm>
 #include <cstdint>
@@ -170,6 +171,17 @@ TEST(NormalizeChannelOrder, SortsByLabelKeepingRepeats) {
     NormalizeChannelOrder(layout);
     EXPECT_EQ(LayoutText(layout), c.normalized);
   }
+}
+
+TEST(NormalizeChannelOrder, SortsAFormatsLayoutOnly) {
+  AudioFormat format;
+  format.SetSampleRate(48000);
+  format.SetSampleType(kAudioSampleType_24BitInteger);
+  format.SetChannelLayout(CreateLegacy51ChannelLayout());
+  NormalizeChannelOrder(format);
+  EXPECT_EQ(LayoutText(format.GetChannelLayout()), "L R C LFE Ls Rs");
+  EXPECT_EQ(format.GetSampleRate(), 48000);
+  EXPECT_EQ(format.GetSampleType(), kAudioSampleType_24BitInteger);
 }
 
 TEST(NormalizeChannelOrder, EveryNamedLayoutKeepsItsChannels) {
