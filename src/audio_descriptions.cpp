@@ -1,3 +1,4 @@
+#include <zebcore/assert.h>
 #include <zebcore/localizer.h>
 #include <zebmediatypes/audio_descriptions.h>
 
@@ -5,7 +6,6 @@
 #include <cstdint>
 #include <cstdio>
 #include <iterator>
-#include <limits>
 #include <string_view>
 
 namespace zebmediatypes {
@@ -259,13 +259,17 @@ UTF16String GetChannelMappingLabels(const ChannelMap& map, unsigned int channelC
                                     const AudioChannelLayout& layout) {
   UTF16String text;
   if (channelCount == 0) return text;
+  std::size_t count = channelCount;
+  if (count > kAudioChannelCount_Max) {
+    zebcore::debug::ReportAssertion("channelCount <= kAudioChannelCount_Max",
+                                    "Channel count out of range; clamped", "AudioDescriptions",
+                                    "zebmediatypes::GetChannelMappingLabels", __LINE__);
+    count = kAudioChannelCount_Max;
+  }
   const UTF16String delimiter = Localize(kDelimiterKey);
-  for (unsigned int c = 0; c < channelCount; ++c) {
+  for (std::size_t c = 0; c < count; ++c) {
     if (c > 0) text += delimiter;
-    // Mappings are int: a numbered channel beyond their range has nothing routed to it.
-    const int j = c <= static_cast<unsigned int>(std::numeric_limits<int>::max())
-                      ? map.Find(static_cast<int>(c))
-                      : -1;
+    const int j = map.Find(static_cast<int>(c));
     if (j < 0) {
       text += u'_';
     } else if (static_cast<std::size_t>(j) >= layout.size()) {

@@ -1,3 +1,4 @@
+#include <zebcore/assert.h>
 #include <zebmediatypes/channel_map.h>
 
 #include <algorithm>
@@ -70,10 +71,16 @@ AudioChannelLabel GetChannelMapDefaultLabel(int index) noexcept {
 
 ChannelMap::ChannelMap(int channelCount) {
   if (channelCount <= 0) return;
-  const auto count = static_cast<std::size_t>(channelCount);
+  auto count = static_cast<std::size_t>(channelCount);
+  if (count > kAudioChannelCount_Max) {
+    zebcore::debug::ReportAssertion("channelCount <= kAudioChannelCount_Max",
+                                    "Channel count out of range; clamped", "ChannelMap",
+                                    "zebmediatypes::ChannelMap::ChannelMap", __LINE__);
+    count = kAudioChannelCount_Max;
+  }
   mChannelLabels.reserve(count);
-  for (int k = 0; k < channelCount; ++k) {
-    mChannelLabels.push_back(SingleLabel(GetChannelMapDefaultLabel(k)));
+  for (std::size_t k = 0; k < count; ++k) {
+    mChannelLabels.push_back(SingleLabel(GetChannelMapDefaultLabel(static_cast<int>(k))));
   }
   mMappings.assign(count, -1);
 }

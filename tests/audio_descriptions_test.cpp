@@ -1,4 +1,5 @@
 #include <gtest/gtest.h>
+#include <zebcore/assert.h>
 #include <zebcore/localizer.h>
 #include <zebmediatypes/audio_descriptions.h>
 
@@ -150,6 +151,15 @@ TEST(GetChannelMappingLabels, ShowsWhatIsRoutedToEachNumberedChannel) {
     SCOPED_TRACE(c.text);
     EXPECT_EQ(Narrow(GetChannelMappingLabels(map, c.count, c.layout)), c.text);
   }
+}
+
+TEST(GetChannelMappingLabels, HugeChannelCountIsReportedAndClamped) {
+  zebcore::debug::ScopedAssertionCapture capture;
+  const UTF16String text = GetChannelMappingLabels(ChannelMap::CreateDefaultChannelMap(2),
+                                                   0xFFFFFFFFu, CreateStereoChannelLayout());
+  EXPECT_EQ(capture.Count(), 1u);
+  EXPECT_EQ(static_cast<std::size_t>(std::count(text.begin(), text.end(), u'_')),
+            kAudioChannelCount_Max - 2);
 }
 
 TEST(GetChannelName, NumbersDiscreteChannelsFromOne) {

@@ -1,4 +1,5 @@
 #include <gtest/gtest.h>
+#include <zebcore/assert.h>
 #include <zebmediatypes/channel_map.h>
 
 #include <limits>
@@ -59,6 +60,17 @@ TEST(ChannelMap, ChannelsBeyondTheDefaultOrderCarryTheUnknownLabel) {
   EXPECT_EQ(Mappings(map), std::vector<int>(40, -1));
   EXPECT_EQ(map.GetNumberOfAssignments(), 0);
   EXPECT_EQ(map.Find(0), -1);
+}
+
+TEST(ChannelMap, HugeChannelCountIsReportedAndClamped) {
+  for (int count :
+       {static_cast<int>(kAudioChannelCount_Max) + 1, std::numeric_limits<int>::max()}) {
+    SCOPED_TRACE(count);
+    zebcore::debug::ScopedAssertionCapture capture;
+    EXPECT_EQ(ChannelMap::CreateDefaultChannelMap(count).GetNumberOfChannels(),
+              static_cast<int>(kAudioChannelCount_Max));
+    EXPECT_EQ(capture.Count(), 1u);
+  }
 }
 
 TEST(ChannelMap, InvalidIndexesGiveNeutralResults) {

@@ -64,6 +64,8 @@ ZEBMEDIATYPES_API zebcore::UTF16String AudioChannelConfigurationDescription(
 // `layout` `map` routes to it (the first map channel mapped to c): "_" when
 // none, "?" when j is not a channel of `layout`, j + 1 for a Discrete channel,
 // otherwise the label's abbreviation; joined with ", ". Empty for a count of 0.
+// A count above kAudioChannelCount_Max is reported through the assertion
+// service and clamped to it.
 ZEBMEDIATYPES_API zebcore::UTF16String GetChannelMappingLabels(const ChannelMap& map,
                                                                unsigned int channelCount,
                                                                const AudioChannelLayout& layout);

@@ -42,7 +42,8 @@ class ZEBMEDIATYPES_API ChannelMap : private boost::equality_comparable<ChannelM
   ChannelMap() = default;
   // `channelCount` unrouted channels (none when it is 0 or negative); channel k
   // carries the label at index k of the default order, kChannelMapUnknownLabel
-  // from 36 up.
+  // from 36 up. A count above kAudioChannelCount_Max is reported through the
+  // assertion service and clamped to it.
   explicit ChannelMap(int channelCount);
   // One unrouted channel per channel of `layout`, carrying its label.
   explicit ChannelMap(AudioChannelLayout layout);
@@ -53,7 +54,8 @@ class ZEBMEDIATYPES_API ChannelMap : private boost::equality_comparable<ChannelM
   virtual ~ChannelMap();
 
   // Mono for 1, L R for 2, L R C LFE Ls Rs for 6, ChannelMap(channelCount)
-  // otherwise; channel k is mapped to k. 0 or less gives an empty map.
+  // otherwise (so with its clamp); channel k is mapped to k. 0 or less gives an
+  // empty map.
   static ChannelMap CreateDefaultChannelMap(int channelCount);
 
   int GetNumberOfChannels() const noexcept { return static_cast<int>(mMappings.size()); }
