@@ -435,14 +435,6 @@ TEST(PixelFormatLayout, InterleavingPlanesAndBytesPerPixel) {
   }
 }
 
-TEST(PixelFormatLayout, OnlyThreeRowsAreNotInterleaved) {
-  int notInterleaved = 0;
-  for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
-    if (GetInterleavingType(*pf) != kInterleaved) ++notInterleaved;
-  }
-  EXPECT_EQ(notInterleaved, 3);
-}
-
 TEST(TranslateFourCC, MapsCodecAliasesOntoTheirFamily) {
   struct Case {
     unsigned int code;
