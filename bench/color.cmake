@@ -1,1 +1,2 @@
 # color benchmarks.
+zmt_add_benchmark(color_bench SOURCES color_bench.cpp)

@@ -11,10 +11,18 @@
 #include <zebmediatypes/time_range.h>
 
 // Timecode text.
+#include <zebmediatypes/timecode.h>
 
 // Audio: channel labels, layouts, analysis, conversion matrix.
+#include <zebmediatypes/audio_channel_layout.h>
+#include <zebmediatypes/channel_conversion_matrix.h>
 
 // Audio: formats, channel maps, buses, native rates, descriptions.
+#include <zebmediatypes/audio_format.h>
+#include <zebmediatypes/channel_map.h>
+#include <zebmediatypes/audio_bus.h>
+#include <zebmediatypes/audio_frame_rate_utils.h>
+#include <zebmediatypes/audio_descriptions.h>
 
 // Video formats: pixel formats, selection and sizing, aspect ratios,
 // descriptions.
@@ -25,3 +33,10 @@
 #include <zebmediatypes/video_descriptions.h>
 
 // Colour records and caches, RGBA, MIME constants, library lifecycle.
+#include <zebmediatypes/color/color_management_settings.h>
+#include <zebmediatypes/color/color_profile.h>
+#include <zebmediatypes/color/color_serialization.h>
+#include <zebmediatypes/color/color_space.h>
+#include <zebmediatypes/color/rgba.h>
+#include <zebmediatypes/initialization.h>
+#include <zebmediatypes/mime_types.h>

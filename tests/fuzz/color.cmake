@@ -1,1 +1,3 @@
 # Colour fuzz targets.
+zmt_add_fuzzer(fuzz_color_space color_space_fuzzer.cpp)
+zmt_add_fuzzer(fuzz_color_management_settings color_management_settings_fuzzer.cpp)
