@@ -18,7 +18,7 @@ fuzz_seconds=${ZMT_FUZZ_SECONDS:-20}
 
 bash scripts/install-deps.sh
 
-step() { printf '\n==== %s\n' "$*"; }
+step() { printf '\n==== [%4ds] %s\n' "$SECONDS" "$*"; }
 
 configure() {  # configure <dir> <cmake args...>
   local dir=$1; shift

@@ -40,16 +40,22 @@ bool RecursiveMutex::Lock(const char* site, unsigned int milliseconds) {
 }
 
 void RecursiveMutex::Unlock() {
+  bool held;
   {
     std::lock_guard<std::mutex> lock(state_);
-    if (depth_ == 0 || owner_ != std::this_thread::get_id()) {
-      debug::ReportAssertion("depth_ > 0 && owner_ == this thread",
-                             "RecursiveMutex unlocked by a thread that does not hold it", __FILE__,
-                             "zebcore::threads::RecursiveMutex::Unlock", __LINE__);
-      return;
+    held = depth_ > 0 && owner_ == std::this_thread::get_id();
+    if (held) {
+      if (--depth_ > 0) return;
+      owner_ = std::thread::id();
     }
-    if (--depth_ > 0) return;
-    owner_ = std::thread::id();
+  }
+  if (!held) {
+    // Reported outside the state lock: the report calls out to a hook that may
+    // take locks of its own.
+    debug::ReportAssertion("depth_ > 0 && owner_ == this thread",
+                           "RecursiveMutex unlocked by a thread that does not hold it", __FILE__,
+                           "zebcore::threads::RecursiveMutex::Unlock", __LINE__);
+    return;
   }
   released_.notify_one();
 }
