@@ -233,7 +233,7 @@ constexpr bool CatalogueFactsHold() {
 }
 static_assert(CatalogueFactsHold());
 
-// The custom registry, created on first use and never destroyed before exit.
+// The custom registry: created on first use, destroyed at exit.
 struct CustomRegistry {
   using Map = std::map<
       std::uint32_t, PixelFormatProperties, std::less<std::uint32_t>,

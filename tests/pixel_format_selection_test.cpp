@@ -61,6 +61,26 @@ TEST(PixelConversionCost, IdentityIsFreeAndEverythingElseCosts) {
   }
 }
 
+TEST(PixelConversionCost, StaysInRangeForAnyWordsExhaustive) {
+  // Every word with the reserved bits clear, from and to a few catalogue words.
+  const PixelFormatProperties kOthers[] = {
+      kPixelFormat_BGRA_4444_8u.properties, kPixelFormat_UYVY_422_8u.properties,
+      kPixelFormat_NTSCDV25.properties, kPixelFormat_VUYA_4444_32f_709.properties};
+  for (std::uint32_t word = 0; word < (1u << 23); ++word) {
+    const PixelFormatProperties p(word);
+    for (const PixelFormatProperties& other : kOthers) {
+      for (RenderQuality q : {kRenderQuality_Draft, kRenderQuality_Max}) {
+        const int to = PixelConversionCost(p, other, q);
+        const int from = PixelConversionCost(other, p, q);
+        ASSERT_GE(to, p == other ? 0 : 1) << word;
+        ASSERT_LE(to, 10000) << word;
+        ASSERT_GE(from, p == other ? 0 : 1) << word;
+        ASSERT_LE(from, 10000) << word;
+      }
+    }
+  }
+}
+
 TEST(PixelConversionCost, GoldenValues) {
   struct Case {
     PixelFormatProperties from;
@@ -381,6 +401,20 @@ TEST(PixelFormatSize, FrameHoldsEveryPlaneRow) {
         EXPECT_GE(static_cast<u128>(size), static_cast<u128>(row) * planes * s.height);
         EXPECT_GE(static_cast<u128>(row) * planes * s.height,
                   NeededFrameBytes(*pf, s.width, s.height));
+      }
+    }
+  }
+}
+
+TEST(PixelFormatSize, FrameHoldsEveryPlaneRowExhaustive) {
+  constexpr int kHeights[] = {1, 2, 3, 31, 32, 33, 359, 1081};
+  for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
+    if (pf->properties.IsDV()) continue;
+    for (int width = 1; width <= 4100; ++width) {
+      for (int height : kHeights) {
+        ASSERT_GE(static_cast<u128>(PixelFormatSize(*pf, width, height)),
+                  NeededFrameBytes(*pf, width, height))
+            << pf->fourCC << " " << width << "x" << height;
       }
     }
   }

@@ -340,6 +340,50 @@ TEST(PixelFormat, NameAndPropertiesRoundTripOverTheCatalogue) {
   }
 }
 
+// The first catalogue row of a name or word, by a plain scan in catalogue order.
+const PixelFormat* ScanForName(std::uint32_t name) {
+  return std::find_if(AllPixelFormatsBegin(), AllPixelFormatsEnd(),
+                      [name](const PixelFormat& pf) { return pf.fourCC == name; });
+}
+const PixelFormat* ScanForWord(std::uint32_t word) {
+  return std::find_if(AllPixelFormatsBegin(), AllPixelFormatsEnd(),
+                      [word](const PixelFormat& pf) { return pf.properties.Word() == word; });
+}
+
+TEST(LookupPropertiesForName, AgreesWithAScanInCatalogueOrder) {
+  // Every catalogue name with one of its bytes replaced by every value.
+  for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
+    for (unsigned shift = 0; shift < 32; shift += 8) {
+      for (std::uint32_t byte = 0; byte < 256; ++byte) {
+        const std::uint32_t name = (pf->fourCC & ~(0xFFu << shift)) | byte << shift;
+        if (name == 0 || name == kPixelFormatFourCC_Invalid || IsCustomPixelFormatName(name)) {
+          continue;
+        }
+        const PixelFormat* row = ScanForName(name);
+        const PixelFormatProperties want =
+            row != AllPixelFormatsEnd() ? row->properties : kPixelFormatProperties_Invalid;
+        ASSERT_EQ(LookupPropertiesForName(static_cast<PixelFormatName>(name)), want) << name;
+      }
+    }
+  }
+}
+
+TEST(GuessNameForProperties, AgreesWithAScanInCatalogueOrderExhaustive) {
+  // Every word with the reserved bits clear.
+  for (std::uint32_t word = 0; word < (1u << 23); ++word) {
+    const PixelFormatProperties p(word);
+    std::uint32_t want = kPixelFormatFourCC_Invalid;
+    if (p.validity() == kPixelFormatValidity_Any) {
+      want = kPixelFormatFourCC_Any;
+    } else if (p.validity() != kPixelFormatValidity_Invalid &&
+               p.packing() != kPixelFormatPacking_None) {
+      const PixelFormat* row = ScanForWord(word);
+      if (row != AllPixelFormatsEnd()) want = row->fourCC;
+    }
+    ASSERT_EQ(GuessNameForProperties(p), want) << word;
+  }
+}
+
 TEST(PixelFormat, FromPropertiesGivesARowAnyOrInvalid) {
   struct Case {
     std::uint32_t word;
@@ -433,14 +477,6 @@ TEST(PixelFormatLayout, InterleavingPlanesAndBytesPerPixel) {
     EXPECT_EQ(GetNumberOfPlanes(c.format), c.planes);
     EXPECT_EQ(GetBytesPerPixel(c.format), c.bytesPerPixel);
   }
-}
-
-TEST(PixelFormatLayout, OnlyThreeRowsAreNotInterleaved) {
-  int notInterleaved = 0;
-  for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
-    if (GetInterleavingType(*pf) != kInterleaved) ++notInterleaved;
-  }
-  EXPECT_EQ(notInterleaved, 3);
 }
 
 TEST(TranslateFourCC, MapsCodecAliasesOntoTheirFamily) {

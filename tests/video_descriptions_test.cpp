@@ -3,7 +3,6 @@
 #include <zebmediatypes/pixel_format_selection.h>
 #include <zebmediatypes/video_descriptions.h>
 
-#include <set>
 #include <sstream>
 #include <string>
 
@@ -111,20 +110,6 @@ TEST(GetFourCCDescriptiveName, GivesTheCatalogueNameOrInvalid) {
                   GetFourCCDescriptiveName(static_cast<PixelFormatName>(c.name))),
               c.text);
   }
-}
-
-TEST(GetFourCCDescriptiveName, NamesAreUniqueOverTheCatalogue) {
-  std::set<std::string> seen;
-  int invalid = 0;
-  for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
-    const std::string text = zebcore::string::ToStdString(GetFourCCDescriptiveName(pf->fourCC));
-    if (text == "Invalid") {
-      ++invalid;
-    } else {
-      EXPECT_TRUE(seen.insert(text).second) << text;
-    }
-  }
-  EXPECT_EQ(invalid, 3);
 }
 
 TEST(AlphaDescription, NamesStraightAndPremultiplied) {
