@@ -46,22 +46,52 @@ bool FitsInt64(Wide v) noexcept {
          v <= std::numeric_limits<std::int64_t>::max();
 }
 
-// r * 999999/1000000 with cross-cancellation, exact in 128-bit. A product
-// whose terms do not fit in 64 bits is rounded by dropping low bits of both
-// terms (it keeps its value to about 63 significant bits).
+using WideUnsigned = unsigned __int128;
+
+// A fraction close to n/d (d > 0) whose terms fit in int64: n/d itself when
+// it fits, otherwise its last continued-fraction convergent that does.
+RatioTime ClosestRatio(Wide n, Wide d) noexcept {
+  const bool negative = n < 0;
+  WideUnsigned num = negative ? static_cast<WideUnsigned>(-n) : static_cast<WideUnsigned>(n);
+  WideUnsigned den = static_cast<WideUnsigned>(d);
+  constexpr WideUnsigned kLimit =
+      static_cast<WideUnsigned>(std::numeric_limits<std::int64_t>::max());
+  // Convergents h/k: h(-1) = 1, k(-1) = 0; h(-2) = 0, k(-2) = 1.
+  WideUnsigned h1 = 1, k1 = 0, h2 = 0, k2 = 1;
+  WideUnsigned bestH = 0, bestK = 1;
+  while (den != 0) {
+    const WideUnsigned a = num / den;
+    if ((h1 != 0 && a > (kLimit - h2) / h1) || (k1 != 0 && a > (kLimit - k2) / k1)) break;
+    const WideUnsigned h = a * h1 + h2;
+    const WideUnsigned k = a * k1 + k2;
+    bestH = h;
+    bestK = k;
+    h2 = h1;
+    k2 = k1;
+    h1 = h;
+    k1 = k;
+    const WideUnsigned rest = num - a * den;
+    num = den;
+    den = rest;
+  }
+  const std::int64_t top = static_cast<std::int64_t>(bestH);
+  return RatioTime(negative ? -top : top, static_cast<std::int64_t>(bestK));
+}
+
+// r * 999999/1000000 with cross-cancellation, exact in 128-bit (the terms of a
+// reduced 64-bit fraction times those of the factor always fit). A product
+// whose terms do not fit in 64 bits gives a close 64-bit fraction.
 RatioTime CorrectWide(std::int64_t num, std::int64_t den) noexcept {
   const std::int64_t g1 = static_cast<std::int64_t>(
       std::gcd(Magnitude(num), static_cast<std::uint64_t>(kCorrectionDenominator)));
   const std::int64_t g2 = static_cast<std::int64_t>(
       std::gcd(static_cast<std::uint64_t>(kCorrectionNumerator), Magnitude(den)));
-  Wide n = static_cast<Wide>(num / g1) * (kCorrectionNumerator / g2);
-  Wide d = static_cast<Wide>(den / g2) * (kCorrectionDenominator / g1);
-  while (!FitsInt64(n) || !FitsInt64(d) || d == std::numeric_limits<std::int64_t>::min()) {
-    n /= 2;
-    d /= 2;
+  const Wide n = static_cast<Wide>(num / g1) * (kCorrectionNumerator / g2);
+  const Wide d = static_cast<Wide>(den / g2) * (kCorrectionDenominator / g1);
+  if (FitsInt64(n) && FitsInt64(d)) {
+    return MakeRatio(static_cast<std::int64_t>(n), static_cast<std::int64_t>(d));
   }
-  if (d == 0) d = 1;
-  return MakeRatio(static_cast<std::int64_t>(n), static_cast<std::int64_t>(d));
+  return ClosestRatio(n, d);
 }
 
 }  // namespace

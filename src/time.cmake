@@ -10,5 +10,6 @@ target_sources(zebmediatypes PRIVATE
 
 # Timecode text and the console commands.
 target_sources(zebmediatypes PRIVATE
+  timecode.cpp
   commands/time_commands.cpp
 )

@@ -84,15 +84,18 @@ bool TakesMediaRate(TimeDisplayType type) noexcept {
          type == kTimeDisplay_35mmFeetFrames || type == kTimeDisplay_AudioSamplesTimecode;
 }
 
-// Frames per second rounded half away from zero, at least 1 and at most the
-// largest 32-bit count. No rate counts as 0.
-unsigned int RoundedFramesPerSecond(FrameRate rate) noexcept {
+// Frames per second rounded half away from zero, at least 1. No rate counts as
+// 0. At most 254016000000 (one tick per frame).
+std::int64_t RoundedFramesPerSecond(FrameRate rate) noexcept {
   const double rounded = std::round(rate.GetFramesPerSecond());
-  if (rounded < 1.0) return 1;
-  if (rounded >= static_cast<double>(std::numeric_limits<unsigned int>::max())) {
-    return std::numeric_limits<unsigned int>::max();
-  }
-  return static_cast<unsigned int>(rounded);
+  return rounded < 1.0 ? 1 : static_cast<std::int64_t>(rounded);
+}
+
+// The same as a custom display count, at most the largest 32-bit count.
+unsigned int RoundedCustomFramesPerSecond(FrameRate rate) noexcept {
+  const std::int64_t fps = RoundedFramesPerSecond(rate);
+  return fps > std::numeric_limits<unsigned int>::max() ? std::numeric_limits<unsigned int>::max()
+                                                        : static_cast<unsigned int>(fps);
 }
 
 int DecimalDigits(std::int64_t value) noexcept {
@@ -198,7 +201,7 @@ TimeDisplay GetTimeDisplayForFrameRate(FrameRate rate, bool dropFrame, bool /*un
   }
   if (IsFrameRateAudio(rate)) return TimeDisplay(kTimeDisplay_AudioSamplesTimecode);
   if (rate != kFrameRate_Invalid || fallback == kTimeDisplay_CustomFrameRateTimecode) {
-    return TimeDisplay::CreateCustom(RoundedFramesPerSecond(rate));
+    return TimeDisplay::CreateCustom(RoundedCustomFramesPerSecond(rate));
   }
   return TimeDisplay(fallback);
 }

@@ -48,6 +48,19 @@ TEST(RecursiveMutex, LockTimesOutWhileAnotherThreadHoldsIt) {
   mutex.Unlock();
 }
 
+TEST(RecursiveMutex, AnotherThreadCannotUnlockIt) {
+  zebcore::threads::RecursiveMutex mutex("owned");
+  ASSERT_TRUE(mutex.Lock("owner", 0));
+  zebcore::debug::ScopedAssertionCapture capture;
+  std::thread intruder([&] {
+    mutex.Unlock();
+    EXPECT_FALSE(mutex.Lock("intruder", 10));  // still held by the owner
+  });
+  intruder.join();
+  EXPECT_EQ(capture.Count(), 1u);
+  mutex.Unlock();
+}
+
 TEST(RecursiveMutex, SerializesHolders) {
   zebcore::threads::RecursiveMutex mutex;
   long counter = 0;

@@ -359,6 +359,12 @@ TEST(UTF16OStream, FormatsNumbersLikeTheDefaultNarrowStream) {
   EXPECT_EQ(Narrow(out.str()), "t=42 -7 18446744073709551615 29.97 1e-07 1.23457e+08 0.5 \xC3\xA9");
 }
 
+TEST(UTF16OStream, NullTextWritesNothing) {
+  oUTF16StringStream out;
+  out << static_cast<const char*>(nullptr) << static_cast<const char16_t*>(nullptr) << u"x";
+  EXPECT_EQ(Narrow(out.str()), "x");
+}
+
 TEST(UTF16OStream, EndlWritesANewlineAndFlushes) {
   struct Counting final : UTF16OStream {
     UTF16String text;

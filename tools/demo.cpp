@@ -24,8 +24,8 @@ int main() {
   std::cout << "zebmediatypes: one tick is 1/" << zmt::kTime_OneSecond.GetTicks()
             << " of a second\n\n";
   for (const Example& e : kExamples) {
-    std::cout << e.label << ": " << e.time.GetTicks() << " ticks, " << e.time << " s at " << e.rate
-              << ", " << zmt::details::ExplainTickTimeWithFrameRate(e.time, e.rate) << "\n";
+    std::cout << e.label << ": " << e.time.GetTicks() << " ticks, " << e.time << " s, "
+              << zmt::details::ExplainTickTimeWithFrameRate(e.time, e.rate) << "\n";
   }
 
   zmt::TickTime between(3 * zmt::kFrameRate_Video60.GetTicksPerFrame() + 1);

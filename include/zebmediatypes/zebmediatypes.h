@@ -11,13 +11,26 @@
 #include <zebmediatypes/time_range.h>
 
 // Timecode text.
+#include <zebmediatypes/timecode.h>
 
 // Audio: channel labels, layouts, analysis, conversion matrix.
+#include <zebmediatypes/audio_channel_layout.h>
+#include <zebmediatypes/channel_conversion_matrix.h>
 
 // Audio: formats, channel maps, buses, native rates, descriptions.
+#include <zebmediatypes/audio_format.h>
+#include <zebmediatypes/channel_map.h>
+#include <zebmediatypes/audio_bus.h>
+#include <zebmediatypes/audio_frame_rate_utils.h>
+#include <zebmediatypes/audio_descriptions.h>
 
 // Video formats: pixel formats, selection and sizing, aspect ratios,
 // descriptions.
+#include <zebmediatypes/pixel_aspect_ratio.h>
+#include <zebmediatypes/pixel_format.h>
+#include <zebmediatypes/pixel_format_selection.h>
+#include <zebmediatypes/render_quality.h>
+#include <zebmediatypes/video_descriptions.h>
 
 // Colour records and caches, RGBA, MIME constants, library lifecycle.
 #include <zebmediatypes/color/color_management_settings.h>

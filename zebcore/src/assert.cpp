@@ -18,9 +18,10 @@ struct HookState {
   AssertionHook hook;
 };
 
+// Never destroyed: reports may come from static destructors at exit.
 HookState& Hooks() {
-  static HookState state;
-  return state;
+  static HookState* const state = new HookState;
+  return *state;
 }
 
 std::string Text(const DebugDictionary& report, const char* key) {

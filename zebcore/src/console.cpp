@@ -6,9 +6,11 @@ namespace zebcore::console {
 
 void ConsoleOutputStream::Write(std::u16string_view text) { out_ << string::UTF16toNarrow(text); }
 
+// Never destroyed: a start-up registrar destroyed at exit (while started)
+// unregisters its commands from its terminate function.
 CommandRegistry& CommandRegistry::Get() {
-  static CommandRegistry registry;
-  return registry;
+  static CommandRegistry* const registry = new CommandRegistry;
+  return *registry;
 }
 
 bool CommandRegistry::RegisterCommand(const UTF16String& name, const UTF16String& help,

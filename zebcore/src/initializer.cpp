@@ -16,9 +16,11 @@ struct Registry {
   std::vector<InitializerRegistrar*> started;     // start order
 };
 
+// Never destroyed: registrars of other libraries leave it from their own
+// static destructors, in an order nobody controls.
 Registry& TheRegistry() {
-  static Registry registry;
-  return registry;
+  static Registry* const registry = new Registry;
+  return *registry;
 }
 
 }  // namespace

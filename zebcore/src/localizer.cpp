@@ -6,9 +6,10 @@
 
 namespace zebcore::config {
 
+// Never destroyed: a library that unloads at exit may still ask for texts.
 Localizer& Localizer::Get() {
-  static Localizer instance;
-  return instance;
+  static Localizer* const instance = new Localizer;
+  return *instance;
 }
 
 UTF16String Localizer::Localize(std::string_view key) const {

@@ -20,9 +20,10 @@ struct Sinks {
   int maxLevel = 0;
 };
 
+// Never destroyed, so records from static destructors at exit are safe.
 Sinks& State() {
-  static Sinks sinks;
-  return sinks;
+  static Sinks* const sinks = new Sinks;
+  return *sinks;
 }
 
 std::string StructuredLine(const LogRecord& record) {
@@ -112,8 +113,8 @@ struct UsageState {
 };
 
 UsageState& Usage() {
-  static UsageState state;
-  return state;
+  static UsageState* const state = new UsageState;
+  return *state;
 }
 
 }  // namespace

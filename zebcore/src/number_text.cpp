@@ -14,6 +14,7 @@ namespace zebcore::string {
 namespace {
 
 constexpr int kMaxFractionDigits = 17;
+constexpr int kMaxIntegerDigits = 400;  // more than the largest double has
 // Room for the longest fixed form: 309 integer digits, sign, point, 17 digits.
 constexpr std::size_t kFixedBufferSize = 400;
 
@@ -163,7 +164,7 @@ UTF16String NumberToString(double value, int minIntegerDigits, int fractionDigit
   if (std::isinf(value)) return value < 0 ? u"-inf" : (plus ? u"+inf" : u"inf");
 
   fractionDigits = std::clamp(fractionDigits, 0, kMaxFractionDigits);
-  minIntegerDigits = std::max(minIntegerDigits, 1);
+  minIntegerDigits = std::clamp(minIntegerDigits, 1, kMaxIntegerDigits);
 
   std::string digits = FixedMagnitude(std::fabs(value), fractionDigits);
   if (trim) TrimZeros(digits);

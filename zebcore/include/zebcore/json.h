@@ -40,11 +40,19 @@ inline constexpr std::size_t kMaxJSONDepth = 128;
 
 // Parses `count` bytes at `bytes`. A terminating zero byte inside the range
 // ends the text (callers may pass the length plus one). Null on any failure.
+// A key that appears twice in an object keeps its last value.
 ZEBCORE_API JSONValue JSONParse(const unsigned char* bytes, std::size_t count);
 ZEBCORE_API JSONValue JSONParse(const UTF8String& text);
 
 // Prints `value` as JSON text: members in key order, no white space unless
-// `pretty` is true. A boost::any holding none of the types above prints null.
+// `pretty` is true (then two-space indents). Integers are exact; a double is
+// written in its shortest form that reads back to the same bits, always with a
+// '.' or an exponent; NaN and infinities print null. Strings are escaped, and
+// invalid UTF-8 in them is written as U+FFFD. Besides the types above, int,
+// unsigned int, long long, unsigned long long, float, std::string and a nested
+// JSONValue print as their JSON forms; any other type prints null. Containers
+// nested deeper than kMaxJSONDepth (or a value that contains itself) print null
+// there and are reported as a contract breach.
 ZEBCORE_API UTF8String GetJSONUTF8String(const boost::any& value, bool pretty);
 
 // Adds `key` -> `value` to `object`, which must hold a JSONObject (if it is
@@ -63,7 +71,8 @@ ZEBCORE_API bool ObjectHasProperty(const boost::any& object, std::string_view ke
 ZEBCORE_API JSONValue GetVariantInObject(const boost::any& object, std::string_view key);
 
 // Reads an integer member value: true and `out` set when `value` holds an
-// int64 or a uint64 that fits in int64.
+// int64, a uint64 that fits in int64, an int or an unsigned int; otherwise
+// false and `out` unchanged.
 ZEBCORE_API bool GetJSONInt64(const boost::any& value, std::int64_t& out) noexcept;
 
 // The JSON form of a type, specialized next to the type:

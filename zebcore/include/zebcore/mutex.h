@@ -4,8 +4,11 @@
 //   if (!guard) return;   // not had within 60 s: the body must not run
 #pragma once
 
+#include <condition_variable>
+#include <cstddef>
 #include <mutex>
 #include <string>
+#include <thread>
 
 #include <zebcore/export.h>
 
@@ -21,15 +24,22 @@ class ZEBCORE_API RecursiveMutex {
   // Waits up to `milliseconds` for the lock. True when it is held (once more,
   // for a thread that held it already); false when the wait ran out, in which
   // case it is not held and Unlock must not be called. `site` (null allowed)
-  // names the caller in the trace of a timed-out wait.
+  // names the caller in the trace of a timed-out wait (category
+  // "zebcore.Threads", level 1).
   bool Lock(const char* site, unsigned int milliseconds);
-  // Releases one hold. Only the holding thread may call it.
+  // Releases one hold. Only the holding thread may call it; any other call is
+  // reported as a contract breach and changes nothing.
   void Unlock();
 
   const std::string& Name() const noexcept { return name_; }
 
  private:
-  std::recursive_timed_mutex mutex_;
+  // The owner and depth, guarded by a plain mutex; waiters sleep on the
+  // condition until the depth drops to zero.
+  std::mutex state_;
+  std::condition_variable released_;
+  std::thread::id owner_;
+  std::size_t depth_ = 0;
   std::string name_;
 };
 

@@ -23,7 +23,11 @@ class ZEBCORE_API UTF16OStream {
 
   UTF16OStream& operator<<(std::u16string_view text) { Write(text); return *this; }
   UTF16OStream& operator<<(const UTF16String& text) { Write(View(text)); return *this; }
-  UTF16OStream& operator<<(const char16_t* text) { Write(std::u16string_view(text)); return *this; }
+  // A null pointer writes nothing.
+  UTF16OStream& operator<<(const char16_t* text) {
+    if (text) Write(std::u16string_view(text));
+    return *this;
+  }
   UTF16OStream& operator<<(char16_t c) { Write(std::u16string_view(&c, 1)); return *this; }
   // A narrow character is a character, not a number: ' ' writes a space. Bytes
   // above 0x7F (parts of a UTF-8 sequence) become U+FFFD.
@@ -33,7 +37,9 @@ class ZEBCORE_API UTF16OStream {
   }
   // Narrow text is taken as UTF-8.
   UTF16OStream& operator<<(std::string_view utf8);
-  UTF16OStream& operator<<(const char* utf8) { return *this << std::string_view(utf8); }
+  UTF16OStream& operator<<(const char* utf8) {
+    return utf8 ? *this << std::string_view(utf8) : *this;
+  }
   UTF16OStream& operator<<(const std::string& utf8) { return *this << std::string_view(utf8); }
   UTF16OStream& operator<<(int v) { return *this << static_cast<long long>(v); }
   UTF16OStream& operator<<(unsigned int v) { return *this << static_cast<unsigned long long>(v); }

@@ -60,12 +60,15 @@ enum ENumberToStringFlags : unsigned int {
 // NumberToString()
 //
 // `value` in fixed notation with `fractionDigits` digits after the point
-// (rounded half away from zero at the last digit; 0 to 17), at least
-// `minIntegerDigits` digits before it (zero-padded), a '-' for negative values
+// (0 to 17; the exact binary value rounded at the last digit, an exact half
+// away from zero), at least `minIntegerDigits` digits before it (1 to 400,
+// zero-padded), a '-' for negative values (none when the text is all zeros),
 // and '.' as the decimal point whatever the locale. `maxLength` bounds the text:
 // when the fixed form would be longer, the value is written in scientific
-// notation with as many significant digits as fit. NaN is "nan", infinities
-// "inf" and "-inf".
+// notation with as many significant digits as fit (at most 17; a maxLength too
+// small for even one digit gives the one-digit form). NaN is "nan", infinities
+// "inf" and "-inf". Flag kNumberToString_TrimTrailingZeros also trims the
+// mantissa of the scientific form.
 //
 //   NumberToString(29.97002997, 1, 2, kNumberToString_TrimTrailingZeros, 31)  // u"29.97"
 ZEBCORE_API UTF16String NumberToString(double value, int minIntegerDigits, int fractionDigits,
@@ -75,8 +78,10 @@ ZEBCORE_API UTF16String NumberToString(double value, int minIntegerDigits, int f
 // StringToNumber()
 //
 // Reads a whole decimal number (optional sign, digits, optional fraction and
-// exponent; surrounding white space allowed) into `value` and returns true.
-// Text that is not a number leaves `value` unchanged and returns false.
+// exponent; surrounding ASCII white space allowed) into `value`, correctly
+// rounded, and returns true. A number too small for a double reads as zero.
+// Text that is not a number (including "inf", "nan", hex, and a number too large
+// for a double) leaves `value` unchanged and returns false.
 ZEBCORE_API bool StringToNumber(std::u16string_view text, double& value);
 
 // Replaces each slot @0 to @9 in `text` with the replacement of that number.

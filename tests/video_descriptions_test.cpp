@@ -1,0 +1,268 @@
+#include <gtest/gtest.h>
+#include <zebcore/localizer.h>
+#include <zebmediatypes/pixel_format_selection.h>
+#include <zebmediatypes/video_descriptions.h>
+
+#include <set>
+#include <sstream>
+#include <string>
+
+namespace zebmediatypes {
+namespace {
+
+std::string Text(const zebcore::UTF16String& s) {
+  return zebcore::string::UTF16toNarrow(zebcore::string::View(s));
+}
+
+PixelFormatName Name(const char* text) {
+  return MakePixelFormatName(text[0], text[1], text[2], text[3]);
+}
+
+TEST(PixelFormatDescription, NamesTheLayoutInWords) {
+  struct Case {
+    PixelFormat format;
+    const char* text;
+  };
+  const Case kCases[] = {
+      {kPixelFormat_BGRA_4444_8u, "BGRA 4444 8u Full Range"},
+      {kPixelFormat_VUYA_4444_8u, "VUYA 4444 8u 601"},
+      {kPixelFormat_VUYA_4444_8u_709, "VUYA 4444 8u 709"},
+      {kPixelFormat_UYVY_422_8u, "VUY 422 8u 601"},
+      {kPixelFormat_YUYV_422_8u, "YUV 422 8u 601"},
+      {kPixelFormat_ARGB_4444_8u, "ARGB 4444 8u Full Range"},
+      {kPixelFormat_PRGB_4444_15u, "PRGB 4444 15u Full Range"},
+      {kPixelFormat_RGB_444_10u, "BGR 4444 10u Full Range"},
+      {kPixelFormat_RGB_444_32f_Planar, "RGB 4444 32f Full Range"},
+      {kPixelFormat_BGRA_4444_32f_Linear, "BGRA 4444 32f Linear Full Range"},
+      {kPixelFormat_V210_422_10u_709_FullRange, "VUY 422 10u 709 Full Range"},
+      {kPixelFormat_YUV_422_BiPlanar_10u_as16u, "VUYX 422 10u 709"},
+      {kPixelFormat_NTSCDV25, "NTSC DV"},
+      {kPixelFormat_PAL_DV100_1080i, "PAL DV 100 (1080i)"},
+      {kPixelFormat_PALDV50, "PAL DV 50"},
+      {kPixelFormat_YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_601, "YUV 420 MPEG2 Frame 8u 601"},
+      {kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_8u_709_FullRange,
+       "YUV 420 MPEG4 Frame BiPlanar 8u 709 Full Range"},
+      {kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_10u_as16u_2020_HDR,
+       "YUV 420 MPEG4 Frame BiPlanar 10u 2020 HDR"},
+      {kPixelFormat_YUV_420_MPEG4_FIELD_PICTURE_PLANAR_8u_601, "YUV 420 MPEG4 Field 8u 601"},
+      {kPixelFormat_Any, "Any Pixel Format"},
+      {kPixelFormat_Invalid, "Unknown Pixel Format"},
+      {PixelFormat(Name("_abc"), kPixelFormat_BGRA_4444_8u.properties),
+       "Custom Pixel Format (cba_)"},
+      {PixelFormat(Name("@\x01\x80z"), kPixelFormatProperties_Invalid),
+       "Custom Pixel Format (z? @)"},
+      {PixelFormat(Name("qqqq"), PixelFormatProperties(0x000F8001)),
+       "Unknown Compressed Pixel Format (qqqq)"},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.text);
+    EXPECT_EQ(Text(PixelFormatDescription(c.format)), c.text);
+    std::ostringstream narrow;
+    narrow << c.format;
+    EXPECT_EQ(narrow.str(), c.text);
+    zebcore::string::oUTF16StringStream wide;
+    wide << c.format;
+    EXPECT_EQ(Text(wide.str()), c.text);
+  }
+}
+
+TEST(PixelFormatDescription, EveryCatalogueRowHasATidyDescription) {
+  for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
+    SCOPED_TRACE(pf->fourCC);
+    const std::string text = Text(PixelFormatDescription(*pf));
+    EXPECT_FALSE(text.empty());
+    EXPECT_EQ(text.find("  "), std::string::npos);
+    EXPECT_NE(text.back(), ' ');
+    EXPECT_EQ(text.find("Unknown"), std::string::npos);
+  }
+}
+
+TEST(PixelFormatDescription, UsesTheLocalizer) {
+  zebcore::config::Localizer::Get().InstallTranslations(
+      {{"$$$/zebmediatypes/PixelFormat/FullRange", u"Plein"}});
+  const std::string text = Text(PixelFormatDescription(kPixelFormat_BGRA_4444_8u));
+  zebcore::config::Localizer::Get().ClearTranslations();
+  EXPECT_EQ(text, "BGRA 4444 8u Plein");
+}
+
+TEST(GetFourCCDescriptiveName, GivesTheCatalogueNameOrInvalid) {
+  struct Case {
+    std::uint32_t name;
+    const char* text;
+  };
+  const Case kCases[] = {
+      {Name("nv12"), "NV12_MPEG4_FRAME_709"},
+      {Name("Nv16"), "P210_422_BIPLANAR_10"},
+      {Name("POi0"), "P010_MPEG4_FIELD_HDR"},
+      {Name("Phl0"), "P010_MPEG4_FIELD_HDR_HLG"},
+      {Name("vuya"), "VUYA_4444_8u"},
+      {Name("PHLf"), "P010_MPEG4_FRAME_FullRange_HLG"},
+      {Name("v21f"), "Invalid"},
+      {Name("y210"), "Invalid"},
+      {Name("y21f"), "Invalid"},
+      {Name("zzzz"), "Invalid"},
+      {Name("_abc"), "Invalid"},
+      {0, "Invalid"},
+      {kPixelFormatFourCC_Invalid, "Invalid"},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.text);
+    EXPECT_EQ(zebcore::string::ToStdString(
+                  GetFourCCDescriptiveName(static_cast<PixelFormatName>(c.name))),
+              c.text);
+  }
+}
+
+TEST(GetFourCCDescriptiveName, NamesAreUniqueOverTheCatalogue) {
+  std::set<std::string> seen;
+  int invalid = 0;
+  for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
+    const std::string text = zebcore::string::ToStdString(GetFourCCDescriptiveName(pf->fourCC));
+    if (text == "Invalid") {
+      ++invalid;
+    } else {
+      EXPECT_TRUE(seen.insert(text).second) << text;
+    }
+  }
+  EXPECT_EQ(invalid, 3);
+}
+
+TEST(AlphaDescription, NamesStraightAndPremultiplied) {
+  struct Case {
+    AlphaChannel alpha;
+    const char* text;
+  };
+  const Case kCases[] = {
+      {kAlphaChannel_Straight, "Straight Alpha"},
+      {kAlphaChannel_Premultiplied, "Premultiplied Alpha"},
+      {kAlphaChannel_None, "None"},
+      {static_cast<AlphaChannel>(3), "None"},
+      {static_cast<AlphaChannel>(-1), "None"},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.text);
+    EXPECT_EQ(Text(AlphaDescription(c.alpha)), c.text);
+  }
+}
+
+TEST(FieldTypeDescription, LocalizedAndFixedTexts) {
+  struct Case {
+    int type;
+    const char* localized;
+    const char* fixed;
+  };
+  const Case kCases[] = {
+      {0, "No Fields (Progressive Scan)", "Progressive Scan"},
+      {1, "Upper Field First", "Upper Field First"},
+      {2, "Lower Field First", "Lower Field First"},
+      {3, "Fields (Unknown Dominance)", "Unknown Dominance"},
+      {4, "Any Field Order", "Any Field Order"},
+      {-1, "Field Presence Unknown", "Field Presence Unknown"},
+      {5, "", ""},
+      {7, "", ""},
+      {-2, "", ""},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.type);
+    const auto type = static_cast<FieldType>(c.type);
+    EXPECT_EQ(Text(FieldTypeDescription(type, 1)), c.localized);
+    EXPECT_EQ(Text(FieldTypeDescription(type, 0)), c.fixed);
+    EXPECT_EQ(Text(FieldTypeDescription(type, 2)), c.fixed);
+  }
+}
+
+TEST(PixelAspectRatioDescription, NamesTheKnownRatios) {
+  struct Case {
+    PixelAspectRatio r;
+    const char* text;
+  };
+  const Case kCases[] = {
+      {{1, 1}, "Square Pixels (1.0)"},
+      {{10, 11}, "D1/DV NTSC (0.9091)"},
+      {{40, 33}, "D1/DV NTSC Widescreen 16:9 (1.2121)"},
+      {{768, 702}, "D1/DV PAL (1.0940)"},
+      {{1024, 702}, "D1/DV PAL Widescreen 16:9 (1.4587)"},
+      {{2, 1}, "Anamorphic 2:1 (2.0)"},
+      {{4, 3}, "HD Anamorphic 1080 (1.3333)"},
+      {{3, 2}, "DVCPRO HD (1.5)"},
+      {{9, 10}, "Other Aspect Ratio (0.9000)"},
+      {{648, 720}, "Other Aspect Ratio (0.9000)"},
+      {{0, 1}, "Other Aspect Ratio (0.0000)"},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.text);
+    EXPECT_EQ(Text(PixelAspectRatioDescription(c.r)), c.text);
+  }
+}
+
+TEST(VideoFrameSizeDescription, ShowsTheRatioWhenKnown) {
+  EXPECT_EQ(Text(VideoFrameSizeDescription({10, 10, 720, 480}, kPixelAspectRatio_DVNTSC)),
+            "720w 480h (0.9091)");
+  EXPECT_EQ(Text(VideoFrameSizeDescription({10, 10, 720, 480}, kPixelAspectRatio_Any)),
+            "720w 480h");
+  EXPECT_EQ(Text(VideoFrameSizeDescription({10, 10, 720, 480}, kPixelAspectRatio_Unknown)),
+            "720w 480h");
+  EXPECT_EQ(Text(VideoFrameSizeDescription({0, 0, -1, 0}, kPixelAspectRatio_Square)),
+            "-1w 0h (1.0)");
+}
+
+TEST(RenderQualityDescription, NamesTheFiveQualities) {
+  const char* kTexts[] = {"", "Draft", "Low", "Medium", "High", "Max", ""};
+  for (int q = 0; q <= 6; ++q) {
+    SCOPED_TRACE(q);
+    EXPECT_EQ(Text(RenderQualityDescription(static_cast<RenderQuality>(q))), kTexts[q]);
+  }
+  EXPECT_EQ(Text(RenderQualityDescription(static_cast<RenderQuality>(-1))), "");
+}
+
+TEST(GetCodecFamilyName, MatchesExactCodes) {
+  struct Case {
+    unsigned int code;
+    const char* family;
+  };
+  const Case kCases[] = {
+      {0x61766331, "H.264"},
+      {0x48323634, "H.264"},
+      {0x63766131, "unknown"},
+      {0, "unknown"},
+      {0xFFFFFFFF, "unknown"},
+      {0x4156646E, "DNxHD"},
+      {0x68647631, "HDV"},
+      {0x68647639, "HDV"},
+      {0x68647630, "unknown"},
+      {0x68647661, "HDV"},
+      {0x68647662, "unknown"},
+      {0x78643561, "XDCAM HD"},
+      {0x78643566, "XDCAM HD"},
+      {0x78643567, "unknown"},
+      {0x78647639, "XDCAM HD"},
+      {0x78647661, "XDCAM HD"},
+      {0x78647662, "XDCAM EX"},
+      {0x78647666, "XDCAM EX"},
+      {0x78647667, "unknown"},
+      {0x30357664, "DV"},
+      {0x64766320, "DV"},
+      {0x64766E31, "DVCPRO HD"},
+      {0x61766369, "AVC-Intra"},
+      {0x706E6720, "PNG"},
+      {0x4D504547, "MPEG 2"},
+      {0x44505820, "Cineon / DPX"},
+      {0x76323130, "Uncompressed YUV"},
+      {0x41414320, "AAC"},
+      {0x74776F73, "Uncompressed (PCM)"},
+      {0x6D703461, "MPEG Audio"},
+      {0x65632D33, "Dolby Digital Plus"},
+      {0x77617663, "WAVE compressed"},
+      {0x61707268, "ProRes RAW"},
+      {0x6170636E, "ProRes"},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.code);
+    EXPECT_EQ(GetCodecFamilyName(c.code), c.family);
+  }
+  EXPECT_EQ(GetCodecFamilyName(TranslateFourCC(0x63766131)), "AVC-Intra");
+  EXPECT_EQ(GetCodecFamilyName(TranslateFourCC(0x4D435054)), "MPEG 2");
+}
+
+}  // namespace
+}  // namespace zebmediatypes
