@@ -12,9 +12,9 @@
 // parameters keep the single space after the semicolon.
 #pragma once
 
-#include <cstddef>
-
 #include <zebcore/immutable_string.h>
+
+#include <cstddef>
 
 namespace zebmediatypes {
 
@@ -284,7 +284,8 @@ inline constexpr zebcore::utility::ImmutableString kMimeType_Audio_RealAudio =
 inline constexpr zebcore::utility::ImmutableString kMimeType_Audio_RealAudio_ =
     zebcore::utility::ImmutableString::_PrivateCreateStatic("audio/application/x-pn-realaudio");
 inline constexpr zebcore::utility::ImmutableString kMimeType_Audio_RealAudioPlugin =
-    zebcore::utility::ImmutableString::_PrivateCreateStatic("audio/application/x-pn-realaudio-plugin");
+    zebcore::utility::ImmutableString::_PrivateCreateStatic(
+        "audio/application/x-pn-realaudio-plugin");
 inline constexpr zebcore::utility::ImmutableString kMimeType_Audio_RealMedia =
     zebcore::utility::ImmutableString::_PrivateCreateStatic("audio/application/x-pn-realmedia");
 inline constexpr zebcore::utility::ImmutableString kMimeType_Audio_RealSID =
@@ -396,7 +397,8 @@ inline constexpr zebcore::utility::ImmutableString kMimeType_Audio_VndRhetorex32
 inline constexpr zebcore::utility::ImmutableString kMimeType_Audio_VndRNRealaudio =
     zebcore::utility::ImmutableString::_PrivateCreateStatic("audio/vnd.rn-realaudio");
 inline constexpr zebcore::utility::ImmutableString kMimeType_Audio_VndRNRealaudio3 =
-    zebcore::utility::ImmutableString::_PrivateCreateStatic("audio/vnd.rn-realaudio; version=\"3\"");
+    zebcore::utility::ImmutableString::_PrivateCreateStatic(
+        "audio/vnd.rn-realaudio; version=\"3\"");
 inline constexpr zebcore::utility::ImmutableString kMimeType_Audio_VndSealedMediaSoftsealMpeg =
     zebcore::utility::ImmutableString::_PrivateCreateStatic("audio/vnd.sealedmedia.softseal.mpeg");
 inline constexpr zebcore::utility::ImmutableString kMimeType_Audio_VndVmxCvsd =

@@ -157,10 +157,10 @@ bool ReadBoolMember(const JSONObject& object, std::string_view key, bool& field)
 }
 
 // Parses the text (with its terminating zero, as the core reader expects) and
-// unwraps a "SerializerWrappedObject". Null when there is no object to read.
-std::optional<JSONValue> ParseDocument(const UTF8String& text) {
+// unwraps a "SerializerWrappedObject". Null unless there is an object to read.
+JSONValue ParseDocument(const UTF8String& text) {
   JSONValue document = zebcore::serialization::JSONParse(text.c_str(), text.size() + 1);
-  if (!document) return std::nullopt;
+  if (!document) return nullptr;
   if (const auto* outer = boost::any_cast<JSONObject>(document.get())) {
     const JSONValue* wrapped = MemberSlot(*outer, kWrapperKey);
     if (wrapped != nullptr && !(*wrapped)->empty()) {
@@ -168,7 +168,7 @@ std::optional<JSONValue> ParseDocument(const UTF8String& text) {
       document = std::move(inner);
     }
   }
-  if (boost::any_cast<JSONObject>(document.get()) == nullptr) return std::nullopt;
+  if (boost::any_cast<JSONObject>(document.get()) == nullptr) return nullptr;
   return document;
 }
 
@@ -177,8 +177,11 @@ bool ReadProfile(const JSONObject& object, ColorProfile& profile) {
     profile.colorProfileName = ReadString(*name);
   }
   if (const boost::any* data = Member(object, kColorProfileDataKey)) {
+    // A value that is not a string reads as empty text: a block of 0 bytes.
+    static const UTF8String kNoText;
+    const auto* encoded = boost::any_cast<UTF8String>(data);
     std::vector<unsigned char> bytes;
-    if (!zebcore::utility::DecodeBinaryDataFromUTF8String(ReadString(*data), bytes)) {
+    if (!zebcore::utility::DecodeBinaryDataFromUTF8String(encoded ? *encoded : kNoText, bytes)) {
       return false;  // corrupt profile bytes are never kept
     }
     auto block = zebcore::allocator::RecycledMemory::Create(0);
@@ -190,9 +193,9 @@ bool ReadProfile(const JSONObject& object, ColorProfile& profile) {
 }
 
 std::optional<color::ColorSpace> ReadColorSpace(const UTF8String& text) {
-  const std::optional<JSONValue> document = ParseDocument(text);
+  const JSONValue document = ParseDocument(text);
   if (!document) return std::nullopt;
-  const JSONObject& object = *boost::any_cast<JSONObject>(document->get());
+  const JSONObject& object = *boost::any_cast<JSONObject>(document.get());
   color::ColorSpace space;
   if (const boost::any* profile = Member(object, kBaseColorProfileKey)) {
     const auto* profileObject = boost::any_cast<JSONObject>(profile);
@@ -355,9 +358,9 @@ ColorSpace ColorSpaceFromSerializedString(const UTF8String& text) noexcept {
 ColorManagementSettings ColorManagementSettingsFromSerializedString(
     const UTF8String& text) noexcept {
   try {
-    const std::optional<JSONValue> document = ParseDocument(text);
+    const JSONValue document = ParseDocument(text);
     if (!document) return {};
-    const JSONObject& object = *boost::any_cast<JSONObject>(document->get());
+    const JSONObject& object = *boost::any_cast<JSONObject>(document.get());
     GraphicsWhiteLuminance luminance = kGraphicsWhiteLuminance_100;
     LUTInterpolationMethod method = kLUTInterpolationMethod_TriLinear;
     ColorManagementSystem system = kColorManagementSystem_Korvo;

@@ -1,3 +1,3 @@
 # Colour fuzz targets.
-zmt_add_fuzzer(fuzz_color_space color_space_fuzzer.cpp)
-zmt_add_fuzzer(fuzz_color_management_settings color_management_settings_fuzzer.cpp)
+zmt_add_fuzzer(zebmediatypes_color_space_fuzz color_space_fuzzer.cpp)
+zmt_add_fuzzer(zebmediatypes_color_settings_fuzz color_management_settings_fuzzer.cpp)
