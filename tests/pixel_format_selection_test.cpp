@@ -397,9 +397,10 @@ TEST(PixelFormatSize, FrameHoldsEveryPlaneRow) {
       EXPECT_GE(static_cast<u128>(size), NeededFrameBytes(*pf, s.width, s.height));
       const std::uint64_t row = UncompressedPixelFormatRowBytes(*pf, s.width);
       if (row != 0) {
-        const int planes = GetNumberOfPlanes(*pf);
-        EXPECT_GE(static_cast<u128>(size), static_cast<u128>(row) * planes * s.height);
-        EXPECT_GE(static_cast<u128>(row) * planes * s.height,
+        const auto planes = static_cast<u128>(GetNumberOfPlanes(*pf));
+        const auto height = static_cast<u128>(s.height);
+        EXPECT_GE(static_cast<u128>(size), static_cast<u128>(row) * planes * height);
+        EXPECT_GE(static_cast<u128>(row) * planes * height,
                   NeededFrameBytes(*pf, s.width, s.height));
       }
     }

@@ -72,7 +72,8 @@ TEST(TimeRange, CopyKeepsAndMoveInvalidatesTheSource) {
   fourth = std::move(third);
   EXPECT_EQ(fourth, original);
   EXPECT_FALSE(third);  // NOLINT(bugprone-use-after-move)
-  fourth = std::move(fourth);
+  TimeRange& same = fourth;  // self-move through an alias
+  fourth = std::move(same);
   EXPECT_EQ(fourth, original);
 }
 

@@ -520,8 +520,8 @@ TEST(ColorSpace, WrappedTextsReadTheSame) {
   const char* kTexts[] = {
       "{}",
       "{\"baseColorProfile\":{\"colorProfileName\":\"BT.2020\"},\"baseProfileType\":1}",
-      "{\"baseColorProfile\":{\"colorProfileData\":\"AAECA/8=\",\"colorProfileName\":\"sRGB\"},"
-      "\"baseProfileType\":2,\"colorSpaceLinearized\":true}",
+      ("{\"baseColorProfile\":{\"colorProfileData\":\"AAECA/8=\",\"colorProfileName\":\"sRGB\"},"
+       "\"baseProfileType\":2,\"colorSpaceLinearized\":true}"),
   };
   for (const char* text : kTexts) {
     SCOPED_TRACE(text);

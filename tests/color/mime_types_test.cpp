@@ -15,7 +15,7 @@ namespace {
 const std::string gReadAtLoad = kMimeType_Video_MP4.ToString();
 
 TEST(MimeTypes, ExistBeforeStaticInitializersRun) {
-  static_assert(kMimeType_Audio_MP3.size() == std::strlen("audio/mp3"));
+  static_assert(kMimeType_Audio_MP3.View() == std::string_view("audio/mp3"));
   EXPECT_EQ(gReadAtLoad, std::string(kMimeType_Video_MP4.c_str()));
   EXPECT_FALSE(gReadAtLoad.empty());
 }
