@@ -127,13 +127,18 @@ BENCHMARK_CAPTURE(PeerRead, 25, kPeer25, AV_TIMECODE_FLAG_24HOURSMAX);
 BENCHMARK_CAPTURE(OursFormat, 35mmFeetFrames, k35mm);
 BENCHMARK_CAPTURE(OursRead, 35mmFeetFrames, k35mm);
 
-// Keeps each run's time per iteration (ns) while the console reporter prints.
+// Keeps each benchmark's CPU time per iteration (ns) while the console
+// reporter prints.
 class CollectingReporter : public benchmark::ConsoleReporter {
  public:
   void ReportRuns(const std::vector<Run>& runs) override {
     for (const Run& run : runs) {
-      if (run.run_type == Run::RT_Iteration)
+      // One run, or the median of repetitions when there are several.
+      if (run.run_type == Run::RT_Iteration && run.repetitions <= 1) {
         times_[run.benchmark_name()] = run.GetAdjustedCPUTime();
+      } else if (run.run_type == Run::RT_Aggregate && run.aggregate_name == "median") {
+        times_[run.run_name.str()] = run.GetAdjustedCPUTime();
+      }
     }
     ConsoleReporter::ReportRuns(runs);
   }

@@ -117,30 +117,40 @@ struct Fields {
   std::uint64_t framesPerSecond = 0;  // of the display
 };
 
+// The drop-frame fields of a frame count's magnitude. The numbering is a
+// template argument so that every division is by a constant.
+template <const DropFrameNumbering& n>
+void ComputeDropFrameFields(std::uint64_t magnitude, Fields& out) {
+  auto c = static_cast<std::int64_t>(magnitude % static_cast<std::uint64_t>(24 * n.hourFrames));
+  out.hours = static_cast<std::uint64_t>(c / n.hourFrames);
+  c %= n.hourFrames;
+  std::int64_t minutes = 10 * (c / n.tenMinuteFrames);
+  c %= n.tenMinuteFrames;
+  if (c >= n.firstMinuteFrames) {
+    const std::int64_t k = (c - n.firstMinuteFrames) / n.otherMinuteFrames + 1;
+    minutes += k;
+    c -= k * n.otherMinuteFrames;
+  }
+  out.framesPerSecond = static_cast<std::uint64_t>(n.labelsPerSecond);
+  out.minutes = static_cast<std::uint64_t>(minutes);
+  out.seconds = static_cast<std::uint64_t>(c / n.labelsPerSecond);
+  out.frames = static_cast<std::uint64_t>(c % n.labelsPerSecond);
+}
+
 // The fields of an hours:minutes:seconds:frames display (every display but the
 // frame count).
 Fields ComputeFields(std::int64_t ticks, FrameRate rate, TimeDisplay display) {
   Fields out;
   if (const DropFrameNumbering* drop = DropFrameNumberingOf(display)) {
-    const auto n = *drop;
     const FrameRate counting = CountingRate(rate, display);
     // The sign of the time, except that without a rate every time is zero.
     out.negative = ticks < 0 && counting.IsValid();
-    auto c = static_cast<std::int64_t>(Magnitude(FrameCount(ticks, counting)) %
-                                       static_cast<std::uint64_t>(24 * n.hourFrames));
-    out.hours = static_cast<std::uint64_t>(c / n.hourFrames);
-    c %= n.hourFrames;
-    std::int64_t minutes = 10 * (c / n.tenMinuteFrames);
-    c %= n.tenMinuteFrames;
-    if (c >= n.firstMinuteFrames) {
-      const std::int64_t k = (c - n.firstMinuteFrames) / n.otherMinuteFrames + 1;
-      minutes += k;
-      c -= k * n.otherMinuteFrames;
+    const std::uint64_t magnitude = Magnitude(FrameCount(ticks, counting));
+    if (drop == &kDropFrame2997) {
+      ComputeDropFrameFields<kDropFrame2997>(magnitude, out);
+    } else {
+      ComputeDropFrameFields<kDropFrame5994>(magnitude, out);
     }
-    out.framesPerSecond = static_cast<std::uint64_t>(n.labelsPerSecond);
-    out.minutes = static_cast<std::uint64_t>(minutes);
-    out.seconds = static_cast<std::uint64_t>(c / n.labelsPerSecond);
-    out.frames = static_cast<std::uint64_t>(c % n.labelsPerSecond);
     return out;
   }
   std::uint64_t a = 0;

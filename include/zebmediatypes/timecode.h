@@ -81,10 +81,12 @@ ZEBMEDIATYPES_API zebcore::UTF16String RatioTimeToTimecode(
 
 // TimeToHMSF()
 //
-// The fields the text is made of. `negative` is whether the time (for the
-// milliseconds and timecode displays: the counted frames) is below zero; the
-// other fields hold magnitudes, hours wrapped at 24. For kTimeDisplay_Frames
-// only `frames` is set, to the signed frame count's two's-complement bits.
+// The fields the text is made of: magnitudes, hours wrapped at 24. `negative`
+// is whether the time is below zero (in the drop-frame displays), or the
+// counted milliseconds or frames are (in the others); with no rate every field
+// is zero and `negative` false. For kTimeDisplay_Frames only `frames` (the
+// two's-complement bits of the signed frame count) and `negative` (the time is
+// below zero) are set.
 ZEBMEDIATYPES_API void TimeToHMSF(unsigned& hours, unsigned& minutes, unsigned& seconds,
                                   std::uint64_t& frames, bool& negative, TickTime time,
                                   FrameRate rate, TimeDisplay display);
