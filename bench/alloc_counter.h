@@ -7,9 +7,9 @@
 //   state.counters["allocs/iter"] = zmt::bench::AllocationsPerIteration(state, before);
 #pragma once
 
-#include <cstdint>
-
 #include <benchmark/benchmark.h>
+
+#include <cstdint>
 
 namespace zmt::bench {
 

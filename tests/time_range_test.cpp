@@ -71,7 +71,7 @@ TEST(TimeRange, CopyKeepsAndMoveInvalidatesTheSource) {
   TimeRange fourth;
   fourth = std::move(third);
   EXPECT_EQ(fourth, original);
-  EXPECT_FALSE(third);  // NOLINT(bugprone-use-after-move)
+  EXPECT_FALSE(third);       // NOLINT(bugprone-use-after-move)
   TimeRange& same = fourth;  // self-move through an alias
   fourth = std::move(same);
   EXPECT_EQ(fourth, original);

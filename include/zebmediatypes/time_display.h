@@ -14,16 +14,13 @@
 #include <zebcore/stream.h>
 #include <zebcore/string.h>
 #include <zebmediatypes/export.h>
+#include <zebmediatypes/localized_description.h>
 #include <zebmediatypes/tick_time.h>
 
 #include <cstdint>
 #include <iosfwd>
 
 namespace zebmediatypes {
-
-// The flag of the description functions: 1 asks for the localized text, any
-// other value for the plain English text.
-using LocalizedDescription = int;
 
 // Display type codes. Any code not listed behaves like kTimeDisplay_Invalid.
 enum TimeDisplayType : std::int32_t {

@@ -13,6 +13,7 @@
 #include <zebcore/stream.h>
 #include <zebcore/string.h>
 #include <zebmediatypes/export.h>
+#include <zebmediatypes/localized_description.h>
 #include <zebmediatypes/pixel_aspect_ratio.h>
 #include <zebmediatypes/pixel_format.h>
 #include <zebmediatypes/render_quality.h>
@@ -22,10 +23,6 @@
 #include <string>
 
 namespace zebmediatypes {
-
-// Description flag: 1 asks for the localized text, any other value for the
-// fixed English text.
-using LocalizedDescription = int;
 
 enum FieldType : std::int32_t {
   kFieldType_Unknown = -1,     // field presence unknown

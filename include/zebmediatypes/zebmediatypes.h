@@ -3,6 +3,7 @@
 #pragma once
 
 #include <zebmediatypes/export.h>
+#include <zebmediatypes/localized_description.h>
 
 // Time: ticks and frame rates, ratio times, displays and timecode, ranges.
 #include <zebmediatypes/ratio_time.h>
@@ -18,11 +19,11 @@
 #include <zebmediatypes/channel_conversion_matrix.h>
 
 // Audio: formats, channel maps, buses, native rates, descriptions.
-#include <zebmediatypes/audio_format.h>
-#include <zebmediatypes/channel_map.h>
 #include <zebmediatypes/audio_bus.h>
-#include <zebmediatypes/audio_frame_rate_utils.h>
 #include <zebmediatypes/audio_descriptions.h>
+#include <zebmediatypes/audio_format.h>
+#include <zebmediatypes/audio_frame_rate_utils.h>
+#include <zebmediatypes/channel_map.h>
 
 // Video formats: pixel formats, selection and sizing, aspect ratios,
 // descriptions.

@@ -1,11 +1,11 @@
 // Fuzzes the JSON reader: any bytes give null or a value whose printed text
 // reads back and prints the same.
 
+#include <zebcore/json.h>
+
 #include <cstddef>
 #include <cstdint>
 #include <cstdlib>
-
-#include <zebcore/json.h>
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   using namespace zebcore::serialization;

@@ -13,15 +13,12 @@
 #include <zebcore/guid.h>
 #include <zebcore/string.h>
 #include <zebmediatypes/export.h>
+#include <zebmediatypes/localized_description.h>
 
 #include <boost/operators.hpp>
 #include <cstdint>
 
 namespace zebmediatypes {
-
-// The flag of the description functions: 1 asks for the localized text, any
-// other value for the plain English text.
-using LocalizedDescription = int;
 
 namespace color {
 

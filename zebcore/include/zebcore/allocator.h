@@ -9,12 +9,12 @@
 // share the bytes.
 #pragma once
 
+#include <zebcore/export.h>
+
 #include <cstddef>
 #include <memory>
 #include <new>
 #include <vector>
-
-#include <zebcore/export.h>
 
 namespace zebcore::allocator {
 
@@ -27,12 +27,8 @@ class STLAllocator {
   template <class U>
   constexpr STLAllocator(const STLAllocator<U>&) noexcept {}  // NOLINT: rebinding
 
-  [[nodiscard]] T* allocate(std::size_t n) {
-    return std::allocator<T>().allocate(n);
-  }
-  void deallocate(T* p, std::size_t n) noexcept {
-    std::allocator<T>().deallocate(p, n);
-  }
+  [[nodiscard]] T* allocate(std::size_t n) { return std::allocator<T>().allocate(n); }
+  void deallocate(T* p, std::size_t n) noexcept { std::allocator<T>().deallocate(p, n); }
 
   template <class U>
   friend constexpr bool operator==(const STLAllocator&, const STLAllocator<U>&) noexcept {
@@ -61,9 +57,7 @@ class ZEBCORE_API RecycledMemory {
 
   // The bytes, or null for a block of 0 bytes.
   unsigned char* GetData() noexcept { return bytes_.empty() ? nullptr : bytes_.data(); }
-  const unsigned char* GetData() const noexcept {
-    return bytes_.empty() ? nullptr : bytes_.data();
-  }
+  const unsigned char* GetData() const noexcept { return bytes_.empty() ? nullptr : bytes_.data(); }
   std::size_t GetSize() const noexcept { return bytes_.size(); }
 
  private:

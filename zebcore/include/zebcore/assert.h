@@ -8,13 +8,13 @@
 //                                   "zebmediatypes::TickTime::operator /", __LINE__);
 #pragma once
 
+#include <zebcore/export.h>
+
 #include <functional>
 #include <map>
 #include <mutex>
 #include <string>
 #include <vector>
-
-#include <zebcore/export.h>
 
 namespace zebcore::debug {
 

@@ -1,11 +1,11 @@
 // Binary data as text: standard base64 (RFC 4648, with '=' padding).
 #pragma once
 
-#include <cstddef>
-#include <vector>
-
 #include <zebcore/export.h>
 #include <zebcore/string.h>
+
+#include <cstddef>
+#include <vector>
 
 namespace zebcore::utility {
 

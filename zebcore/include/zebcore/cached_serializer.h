@@ -5,11 +5,11 @@
 // T must be copyable and ordered by operator<.
 #pragma once
 
+#include <zebcore/string.h>
+
 #include <map>
 #include <mutex>
 #include <optional>
-
-#include <zebcore/string.h>
 
 namespace zebcore::serialization {
 

@@ -5,6 +5,10 @@
 // registered name; it is thread-safe.
 #pragma once
 
+#include <zebcore/export.h>
+#include <zebcore/stream.h>
+#include <zebcore/string.h>
+
 #include <functional>
 #include <map>
 #include <memory>
@@ -12,10 +16,6 @@
 #include <ostream>
 #include <utility>
 #include <vector>
-
-#include <zebcore/export.h>
-#include <zebcore/stream.h>
-#include <zebcore/string.h>
 
 namespace zebcore::console {
 

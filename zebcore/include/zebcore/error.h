@@ -1,11 +1,11 @@
 // ThrowError: raises the family's exception with a localized message.
 #pragma once
 
+#include <zebcore/export.h>
+
 #include <stdexcept>
 #include <string>
 #include <string_view>
-
-#include <zebcore/export.h>
 
 namespace zebcore::config {
 

@@ -21,8 +21,14 @@ class Flags {
   constexpr bool IsSet(T bits) const noexcept { return (bits_ & bits) == bits; }
   // True when any bit of `bits` is set.
   constexpr bool IsAnySet(T bits) const noexcept { return (bits_ & bits) != 0; }
-  constexpr Flags& Set(T bits) noexcept { bits_ |= bits; return *this; }
-  constexpr Flags& Clear(T bits) noexcept { bits_ &= static_cast<T>(~bits); return *this; }
+  constexpr Flags& Set(T bits) noexcept {
+    bits_ |= bits;
+    return *this;
+  }
+  constexpr Flags& Clear(T bits) noexcept {
+    bits_ &= static_cast<T>(~bits);
+    return *this;
+  }
 
   friend constexpr Flags operator|(Flags a, Flags b) noexcept { return Flags(a.bits_ | b.bits_); }
   friend constexpr Flags operator&(Flags a, Flags b) noexcept { return Flags(a.bits_ & b.bits_); }

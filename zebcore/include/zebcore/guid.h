@@ -7,13 +7,13 @@
 // output buffer).
 #pragma once
 
+#include <zebcore/export.h>
+
 #include <array>
 #include <cstddef>
 #include <cstdint>
 #include <cstring>
 #include <string>
-
-#include <zebcore/export.h>
 
 namespace zebcore::utility {
 

@@ -12,9 +12,9 @@
 // StartUp or ShutDown themselves.
 #pragma once
 
-#include <cstddef>
-
 #include <zebcore/export.h>
+
+#include <cstddef>
 
 namespace zebcore::config {
 

@@ -17,23 +17,21 @@
 // ranges or a number outside the double range.
 #pragma once
 
+#include <zebcore/export.h>
+#include <zebcore/string.h>
+
+#include <boost/any.hpp>
 #include <cstddef>
 #include <cstdint>
 #include <map>
 #include <memory>
 #include <vector>
 
-#include <boost/any.hpp>
-
-#include <zebcore/export.h>
-#include <zebcore/string.h>
-
 namespace zebcore::serialization {
 
 using JSONValue = std::shared_ptr<boost::any>;
-using JSONObject =
-    std::map<UTF8String, JSONValue, std::less<UTF8String>,
-             allocator::STLAllocator<std::pair<const UTF8String, JSONValue>>>;
+using JSONObject = std::map<UTF8String, JSONValue, std::less<UTF8String>,
+                            allocator::STLAllocator<std::pair<const UTF8String, JSONValue>>>;
 using JSONArray = std::vector<JSONValue, allocator::STLAllocator<JSONValue>>;
 
 inline constexpr std::size_t kMaxJSONDepth = 128;

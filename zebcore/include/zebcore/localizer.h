@@ -8,13 +8,13 @@
 //   UTF16String s = Localizer::Get().Localize("$$$/zebmediatypes/RenderQuality/Draft=Draft");
 #pragma once
 
+#include <zebcore/export.h>
+#include <zebcore/string.h>
+
 #include <map>
 #include <shared_mutex>
 #include <string>
 #include <string_view>
-
-#include <zebcore/export.h>
-#include <zebcore/string.h>
 
 namespace zebcore::config {
 

@@ -5,6 +5,10 @@
 // disabled).
 #pragma once
 
+#include <zebcore/export.h>
+
+#include <boost/any.hpp>
+#include <boost/shared_ptr.hpp>
 #include <exception>
 #include <functional>
 #include <memory>
@@ -12,11 +16,6 @@
 #include <string_view>
 #include <utility>
 #include <vector>
-
-#include <boost/any.hpp>
-#include <boost/shared_ptr.hpp>
-
-#include <zebcore/export.h>
 
 namespace zebcore::logging {
 

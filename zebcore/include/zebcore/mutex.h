@@ -4,13 +4,13 @@
 //   if (!guard) return;   // not had within 60 s: the body must not run
 #pragma once
 
+#include <zebcore/export.h>
+
 #include <condition_variable>
 #include <cstddef>
 #include <mutex>
 #include <string>
 #include <thread>
-
-#include <zebcore/export.h>
 
 namespace zebcore::threads {
 

@@ -1,9 +1,9 @@
 // RationalApproximation: the closest fraction with 32-bit terms.
 #pragma once
 
-#include <boost/rational.hpp>
-
 #include <zebcore/export.h>
+
+#include <boost/rational.hpp>
 
 namespace zebcore::utility {
 

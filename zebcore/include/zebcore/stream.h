@@ -7,12 +7,12 @@
 // doubles), and widened.
 #pragma once
 
+#include <zebcore/export.h>
+#include <zebcore/string.h>
+
 #include <cstdint>
 #include <string>
 #include <string_view>
-
-#include <zebcore/export.h>
-#include <zebcore/string.h>
 
 namespace zebcore::string {
 
@@ -21,14 +21,23 @@ class ZEBCORE_API UTF16OStream {
  public:
   virtual ~UTF16OStream() = default;
 
-  UTF16OStream& operator<<(std::u16string_view text) { Write(text); return *this; }
-  UTF16OStream& operator<<(const UTF16String& text) { Write(View(text)); return *this; }
+  UTF16OStream& operator<<(std::u16string_view text) {
+    Write(text);
+    return *this;
+  }
+  UTF16OStream& operator<<(const UTF16String& text) {
+    Write(View(text));
+    return *this;
+  }
   // A null pointer writes nothing.
   UTF16OStream& operator<<(const char16_t* text) {
     if (text) Write(std::u16string_view(text));
     return *this;
   }
-  UTF16OStream& operator<<(char16_t c) { Write(std::u16string_view(&c, 1)); return *this; }
+  UTF16OStream& operator<<(char16_t c) {
+    Write(std::u16string_view(&c, 1));
+    return *this;
+  }
   // A narrow character is a character, not a number: ' ' writes a space. Bytes
   // above 0x7F (parts of a UTF-8 sequence) become U+FFFD.
   UTF16OStream& operator<<(char c) {

@@ -9,14 +9,14 @@
 // reading goes on after it; nothing is read past the end of the input.
 #pragma once
 
+#include <zebcore/allocator.h>
+#include <zebcore/export.h>
+#include <zebcore/flags.h>
+
 #include <cstddef>
 #include <string>
 #include <string_view>
 #include <vector>
-
-#include <zebcore/allocator.h>
-#include <zebcore/export.h>
-#include <zebcore/flags.h>
 
 namespace zebcore {
 
@@ -53,8 +53,8 @@ inline std::string_view View(const UTF8String& s) noexcept {
 // NumberToString flags.
 enum ENumberToStringFlags : unsigned int {
   kNumberToString_Default = 0,
-  kNumberToString_ShowPlusSign = 1,     // "+1.5" for positive values
-  kNumberToString_TrimTrailingZeros = 4 // "25" not "25.00"; "29.97" not "29.970"
+  kNumberToString_ShowPlusSign = 1,      // "+1.5" for positive values
+  kNumberToString_TrimTrailingZeros = 4  // "25" not "25.00"; "29.97" not "29.970"
 };
 
 // NumberToString()
@@ -72,8 +72,7 @@ enum ENumberToStringFlags : unsigned int {
 //
 //   NumberToString(29.97002997, 1, 2, kNumberToString_TrimTrailingZeros, 31)  // u"29.97"
 ZEBCORE_API UTF16String NumberToString(double value, int minIntegerDigits, int fractionDigits,
-                                       utility::Flags<unsigned int> flags,
-                                       std::size_t maxLength);
+                                       utility::Flags<unsigned int> flags, std::size_t maxLength);
 
 // StringToNumber()
 //
