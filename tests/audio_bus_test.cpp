@@ -20,21 +20,19 @@ TEST(AudioBusDescription, EquivalenceLooksAtLayoutsOnly) {
   const Bus discrete(u"Main", CreateMultichannelLayout(2), Bus::Main);
   const Bus mono = Bus::CreateMono(u"Mono", Bus::Main);
   EXPECT_NE(stereo, side);
-  EXPECT_TRUE(stereo.IsEquivalent(side, true) && stereo.IsEquivalent(side, false));
+  EXPECT_TRUE(stereo.IsEquivalent(side, true));
   EXPECT_TRUE(stereo.IsEquivalent(discrete, false));
   EXPECT_FALSE(stereo.IsEquivalent(discrete, true));
   EXPECT_TRUE(AreAudioBusDescriptionsEquivalent({}, {}, true));
   EXPECT_TRUE(AreAudioBusDescriptionsEquivalent({stereo, mono}, {side, mono}, true));
   EXPECT_FALSE(AreAudioBusDescriptionsEquivalent({stereo, mono}, {mono, stereo}, false));
   EXPECT_FALSE(AreAudioBusDescriptionsEquivalent({stereo}, {stereo, stereo}, false));
-  // The flag chooses between a label and a count comparison, as for IsEquivalent.
   EXPECT_FALSE(AreAudioBusDescriptionsEquivalent({stereo}, {discrete}, true));
   EXPECT_TRUE(AreAudioBusDescriptionsEquivalent({stereo}, {discrete}, false));
 }
 
 TEST(AudioBusDescription, AssignmentAndSwapExchangeEveryField) {
-  Bus a = Bus::CreateSurround51(u"five", Bus::Main);
-  Bus b = Bus::CreateMono(u"one", Bus::Auxiliary);
+  Bus a = Bus::CreateSurround51(u"five", Bus::Main), b = Bus::CreateMono(u"one", Bus::Auxiliary);
   const Bus a0 = a, b0 = b;
   swap(a, b);
   EXPECT_TRUE(a == b0 && b == a0);

@@ -18,19 +18,24 @@ std::string Narrow(const UTF16String& text) {
   return zebcore::string::UTF16toNarrow(zebcore::string::View(text));
 }
 
-AudioChannelLayout Layout(std::initializer_list<AudioChannelLabel> labels) {
-  AudioChannelLayout layout;
-  for (AudioChannelLabel label : labels) layout.push_back(label);
-  return layout;
+struct TextCase {
+  UTF16String text;
+  const char* expected;
+};
+
+void ExpectTexts(const std::vector<TextCase>& cases) {
+  for (const TextCase& c : cases) {
+    SCOPED_TRACE(c.expected);
+    EXPECT_EQ(Narrow(c.text), c.expected);
+  }
 }
 
 TEST(AudioChannelLabelDescription, GivesTheEnglishDefaults) {
   struct Case {
     AudioChannelLabel label;
-    const char* description;
-    const char* mnemonic;
-    const char* abbreviation;
+    const char *description, *mnemonic, *abbreviation;
   };
+  // clang-format off
   const Case kCases[] = {
       {L::Discrete, "Mono", "&Mono", "*"},
       {L::LowFrequency, "Low Frequency Effects", "Low Fre&quency Effects", "LFE"},
@@ -39,6 +44,7 @@ TEST(AudioChannelLabelDescription, GivesTheEnglishDefaults) {
       {L::LFE2, "Low Frequency Effects 2", "Low Frequency Effects &2", "LFE2"},
       {L::AmbisonicsHOA, "Higher Order Ambisonics", "Higher Order &Ambisonics", "*"},
   };
+  // clang-format on
   for (const Case& c : kCases) {
     SCOPED_TRACE(static_cast<std::uint32_t>(c.label));
     EXPECT_EQ(Narrow(AudioChannelLabelDescription(c.label, false)), c.description);
@@ -56,8 +62,7 @@ TEST(AudioChannelLabelDescription, EveryLabelHasTextsAndOneAccessKey) {
     std::string mnemonic = Narrow(AudioChannelLabelDescription(d.label, true));
     ASSERT_FALSE(description.empty());
     ASSERT_EQ(std::count(mnemonic.begin(), mnemonic.end(), '&'), 1);
-    mnemonic.erase(mnemonic.find('&'), 1);
-    EXPECT_EQ(mnemonic, description);
+    EXPECT_EQ(mnemonic.erase(mnemonic.find('&'), 1), description);
     EXPECT_FALSE(AudioChannelLabelAbbreviations(d.label).empty());
     if (d.label != L::AmbisonicsHOA) {
       EXPECT_EQ(AudioChannelLabelAbbreviations(d.label),
@@ -67,8 +72,7 @@ TEST(AudioChannelLabelDescription, EveryLabelHasTextsAndOneAccessKey) {
 }
 
 TEST(AudioChannelLabelDescription, UnknownValuesGiveEmptyTexts) {
-  constexpr std::uint32_t kUnknown[] = {1, 99, 120, 125, 126, 144, 1000, 0x7FFFFFFF, 0xFFFFFFFF};
-  for (std::uint32_t value : kUnknown) {
+  for (std::uint32_t value : {1u, 99u, 120u, 125u, 126u, 144u, 1000u, 0x7FFFFFFFu, 0xFFFFFFFFu}) {
     SCOPED_TRACE(value);
     const auto label = static_cast<AudioChannelLabel>(value);
     EXPECT_TRUE(AudioChannelLabelDescription(label, false).empty());
@@ -78,79 +82,50 @@ TEST(AudioChannelLabelDescription, UnknownValuesGiveEmptyTexts) {
   }
 }
 
-TEST(AudioChannelLayoutDescription, NamesCommonLayoutsAndListsTheOthers) {
-  struct Case {
-    AudioChannelLayout layout;
-    const char* text;
-  };
-  const Case kCases[] = {
-      {{}, "0 Channels"},
-      {CreateMonoChannelLayout(), "Mono"},
-      {CreateMultichannelLayout(2), "2 Channels"},
-      {CreateStereoChannelLayout(), "Stereo"},
-      {Layout({L::FrontRight, L::FrontLeft}), "2 Channels (R L)"},
-      {CreateMatrixStereoChannelLayout(), "2 Channels (Lt Rt)"},
-      {Layout({L::FrontCenter}), "1 Channel (C)"},
-      {Layout({L::FrontLeft, L::Discrete, L::FrontRight}), "3 Channels (L * R)"},
-      {CreateBroadcast51ChannelLayout(), "5.1 (L, R, C, LFE, Ls, Rs)"},
-      {CreateLegacy51ChannelLayout(), "5.1 (L, R, Ls, Rs, C, LFE)"},
-      {CreateHexagonalChannelLayout(), "6 Channels (L R Ls Rs C Cs)"},
-      {CreateSmpteDtvChannelLayout(), "SMPTE DTV (L R C LFE Ls Rs Lt Rt)"},
-      {Layout({L::FrontRight, L::FrontLeft, L::FrontCenter, L::LowFrequency, L::BackLeft,
-               L::BackRight, L::LeftTotal, L::RightTotal}),
-       "8 Channels (R L C LFE Ls Rs Lt Rt)"},
-      {Create7_1ItuChannelLayout(), "8 Channels (L R C LFE Ls Rs Rls Rrs)"},
-      {CreateVST10_2ChannelLayout(), "12 Channels (L R C LFE Ls Rs Vhl...)"},
-      {CreateSMPTEDigitalCinema6Channel(), "16 Channels (L R C LFE Ls Rs *...)"},
-      {Layout({static_cast<L>(0xFFFFFFFFu), L::FrontLeft}), "2 Channels ( L)"},
-  };
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.text);
-    EXPECT_EQ(Narrow(AudioChannelLayoutDescription(c.layout)), c.text);
-  }
-  EXPECT_EQ(Narrow(AudioChannelLayoutDescriptionUnlocalized(CreateBroadcast51ChannelLayout())),
-            "L,R,C,LFE,Ls,Rs,");
-  EXPECT_EQ(Narrow(AudioChannelLayoutDescriptionUnlocalized({})), "");
-}
-
-TEST(AudioChannelConfigurationDescription, DescribesTheStreamsOfAnItem) {
-  const AudioChannelLayout stereo = CreateStereoChannelLayout();
-  const AudioChannelLayout mono = CreateMonoChannelLayout();
+TEST(AudioDescriptions, EnglishDefaultsNameLayoutsStreamsAndChannels) {
+  const AudioChannelLayout stereo = CreateStereoChannelLayout(), mono = CreateMonoChannelLayout();
   const AudioChannelLayout fiveOne = CreateBroadcast51ChannelLayout();
-  struct Case {
-    AudioChannelLayoutList layouts;
-    const char* text;
-  };
-  const Case kCases[] = {
-      {{}, "(No Audio Streams)"},
-      {{stereo}, "Stereo"},
-      {{stereo, stereo}, "2 x Stereo"},
-      {{fiveOne, stereo}, "5.1 (L, R, C, LFE, Ls, Rs) + Stereo"},
-      {{stereo, mono, stereo}, "3 Audio Streams"},
-      {{stereo, stereo, mono}, "3 Audio Streams"},
-  };
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.text);
-    EXPECT_EQ(Narrow(AudioChannelConfigurationDescription(c.layouts)), c.text);
-  }
-}
-
-TEST(GetChannelMappingLabels, ShowsWhatIsRoutedToEachNumberedChannel) {
+  const AudioChannelLayout discrete = CreateMultichannelLayout(2);
   const ChannelMap map = ChannelMap::CreateDefaultChannelMap(2);
-  struct Case {
-    unsigned int count;
-    AudioChannelLayout layout;
-    const char* text;
-  };
-  const Case kCases[] = {
-      {3, CreateStereoChannelLayout(), "L, R, _"}, {3, Layout({L::FrontLeft}), "L, ?, _"},
-      {3, CreateMultichannelLayout(2), "1, 2, _"}, {1, CreateStereoChannelLayout(), "L"},
-      {0, CreateStereoChannelLayout(), ""},
-  };
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.text);
-    EXPECT_EQ(Narrow(GetChannelMappingLabels(map, c.count, c.layout)), c.text);
-  }
+  // clang-format off
+  ExpectTexts({
+      {AudioChannelLayoutDescription({}), "0 Channels"},
+      {AudioChannelLayoutDescription(mono), "Mono"},
+      {AudioChannelLayoutDescription(discrete), "2 Channels"},
+      {AudioChannelLayoutDescription(stereo), "Stereo"},
+      {AudioChannelLayoutDescription({L::FrontRight, L::FrontLeft}), "2 Channels (R L)"},
+      {AudioChannelLayoutDescription(CreateMatrixStereoChannelLayout()), "2 Channels (Lt Rt)"},
+      {AudioChannelLayoutDescription({L::FrontCenter}), "1 Channel (C)"},
+      {AudioChannelLayoutDescription({L::FrontLeft, L::Discrete, L::FrontRight}), "3 Channels (L * R)"},
+      {AudioChannelLayoutDescription(fiveOne), "5.1 (L, R, C, LFE, Ls, Rs)"},
+      {AudioChannelLayoutDescription(CreateLegacy51ChannelLayout()), "5.1 (L, R, Ls, Rs, C, LFE)"},
+      {AudioChannelLayoutDescription(CreateHexagonalChannelLayout()), "6 Channels (L R Ls Rs C Cs)"},
+      {AudioChannelLayoutDescription(CreateSmpteDtvChannelLayout()), "SMPTE DTV (L R C LFE Ls Rs Lt Rt)"},
+      {AudioChannelLayoutDescription(Create7_1ItuChannelLayout()), "8 Channels (L R C LFE Ls Rs Rls Rrs)"},
+      {AudioChannelLayoutDescription(CreateVST10_2ChannelLayout()), "12 Channels (L R C LFE Ls Rs Vhl...)"},
+      {AudioChannelLayoutDescription({kChannelMapUnknownLabel, L::FrontLeft}), "2 Channels ( L)"},
+      {AudioChannelLayoutDescriptionUnlocalized(fiveOne), "L,R,C,LFE,Ls,Rs,"},
+      {AudioChannelLayoutDescriptionUnlocalized({}), ""},
+      {AudioChannelConfigurationDescription({}), "(No Audio Streams)"},
+      {AudioChannelConfigurationDescription({stereo}), "Stereo"},
+      {AudioChannelConfigurationDescription({stereo, stereo}), "2 x Stereo"},
+      {AudioChannelConfigurationDescription({fiveOne, stereo}), "5.1 (L, R, C, LFE, Ls, Rs) + Stereo"},
+      {AudioChannelConfigurationDescription({stereo, mono, stereo}), "3 Audio Streams"},
+      {AudioChannelConfigurationDescription({stereo, stereo, mono}), "3 Audio Streams"},
+      {GetChannelMappingLabels(map, 3, stereo), "L, R, _"},
+      {GetChannelMappingLabels(map, 3, {L::FrontLeft}), "L, ?, _"},
+      {GetChannelMappingLabels(map, 3, discrete), "1, 2, _"},
+      {GetChannelMappingLabels(map, 0, stereo), ""},
+      {GetChannelName(discrete, 1, true), "2"},
+      {GetChannelName(discrete, 1, false), "Mono"},
+      {GetChannelName(discrete, 2, true), ""},
+      {GetChannelName(stereo, 0, true), "Left"},
+      {GetChannelName({}, 0xFFFFFFFFu, true), ""},
+      {GetAmbisonicsAudioChannelLabelDescription(0, false), "Ambisonic ACN 0"},
+      {GetAmbisonicsAudioChannelLabelDescription(15, true), "AMB15"},
+      {GetAmbisonicsAudioChannelLabelDescription(SIZE_MAX, true), "AMB18446744073709551615"},
+  });
+  // clang-format on
 }
 
 TEST(GetChannelMappingLabels, HugeChannelCountIsReportedAndClamped) {
@@ -162,26 +137,8 @@ TEST(GetChannelMappingLabels, HugeChannelCountIsReportedAndClamped) {
             kAudioChannelCount_Max - 2);
 }
 
-TEST(GetChannelName, NumbersDiscreteChannelsFromOne) {
-  const AudioChannelLayout discrete = CreateMultichannelLayout(2);
-  EXPECT_EQ(Narrow(GetChannelName(discrete, 1, true)), "2");
-  EXPECT_EQ(Narrow(GetChannelName(discrete, 1, false)), "Mono");
-  EXPECT_EQ(Narrow(GetChannelName(discrete, 2, true)), "");
-  EXPECT_EQ(Narrow(GetChannelName(CreateStereoChannelLayout(), 0, true)), "Left");
-  EXPECT_EQ(Narrow(GetChannelName({}, 0xFFFFFFFFu, true)), "");
-}
-
-TEST(GetAmbisonicsAudioChannelLabelDescription, WritesTheIndexAsGiven) {
-  EXPECT_EQ(Narrow(GetAmbisonicsAudioChannelLabelDescription(0, false)), "Ambisonic ACN 0");
-  EXPECT_EQ(Narrow(GetAmbisonicsAudioChannelLabelDescription(3, false)), "Ambisonic ACN 3");
-  EXPECT_EQ(Narrow(GetAmbisonicsAudioChannelLabelDescription(15, true)), "AMB15");
-  EXPECT_EQ(Narrow(GetAmbisonicsAudioChannelLabelDescription(SIZE_MAX, true)),
-            "AMB18446744073709551615");
-}
-
 // Installs `translations` for the life of the object.
-class ScopedTranslations {
- public:
+struct ScopedTranslations {
   explicit ScopedTranslations(zebcore::config::Localizer::Translations translations) {
     zebcore::config::Localizer::Get().InstallTranslations(std::move(translations));
   }
@@ -189,18 +146,20 @@ class ScopedTranslations {
 };
 
 TEST(AudioDescriptions, LayoutAndStreamTextsComeFromTheirKeys) {
-  const std::string p = "$$$/zebmediatypes/";
+  const std::string p = "$$$/zebmediatypes/",
+                    t = p + "AudioChannelLayout/kChannelConfigurationNameTemplate_";
+  // clang-format off
   const ScopedTranslations translations({
       {p + "AudioChannelLayout/Mono", u"mono"},
       {p + "AudioChannelLayout/Stereo", u"stereo"},
       {p + "AudioChannelLayout/NChannels", u"n@0"},
-      {p + "AudioChannelLayout/kChannelConfigurationNameTemplate_1", u"t1 @0"},
-      {p + "AudioChannelLayout/kChannelConfigurationNameTemplate_3", u"t3 @0@1@2"},
+      {t + "1", u"t1 @0"},
+      {t + "3", u"t3 @0@1@2"},
       {p + "kChannelConfigurationNameTemplate_51", u"t51 @0@5"},
-      {p + "AudioChannelLayout/kChannelConfigurationNameTemplate_6", u"t6 @0@5"},
+      {t + "6", u"t6 @0@5"},
       {p + "SmpteDtv", u"dtv @7"},
-      {p + "AudioChannelLayout/kChannelConfigurationNameTemplate_8", u"t8 @7"},
-      {p + "AudioChannelLayout/kChannelConfigurationNameTemplate_N", u"tN @0 @7 @8"},
+      {t + "8", u"t8 @7"},
+      {t + "N", u"tN @0 @7 @8"},
       {p + "AudioChannelConfiguration/Empty", u"none"},
       {p + "AudioChannelConfiguration/NMatchingStreams", u"@1*@0"},
       {p + "AudioChannelConfiguration/TwoStreams", u"@1&@0"},
@@ -211,15 +170,11 @@ TEST(AudioDescriptions, LayoutAndStreamTextsComeFromTheirKeys) {
       {p + "AudioChannelLabelAbbreviations/Rrs", u"rrs"},
   });
   const AudioChannelLayout stereo = CreateStereoChannelLayout();
-  struct Case {
-    UTF16String text;
-    const char* expected;
-  };
-  const Case kCases[] = {
+  ExpectTexts({
       {AudioChannelLayoutDescription(CreateMonoChannelLayout()), "mono"},
       {AudioChannelLayoutDescription(stereo), "stereo"},
       {AudioChannelLayoutDescription(CreateMultichannelLayout(3)), "n3"},
-      {AudioChannelLayoutDescription(Layout({L::FrontCenter})), "t1 C"},
+      {AudioChannelLayoutDescription({L::FrontCenter}), "t1 C"},
       {AudioChannelLayoutDescription(Create_L_R_C_ChannelLayout()), "t3 LRC"},
       {AudioChannelLayoutDescription(CreateLegacy51ChannelLayout()), "t51 LLFE"},
       {AudioChannelLayoutDescription(CreateHexagonalChannelLayout()), "t6 LCs"},
@@ -233,34 +188,30 @@ TEST(AudioDescriptions, LayoutAndStreamTextsComeFromTheirKeys) {
       {GetAmbisonicsAudioChannelLabelDescription(4, false), "acn4"},
       {GetAmbisonicsAudioChannelLabelDescription(4, true), "amb4"},
       {GetChannelMappingLabels(ChannelMap::CreateDefaultChannelMap(2), 3, stereo), "L|R|_"},
-  };
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.expected);
-    EXPECT_EQ(Narrow(c.text), c.expected);
-  }
+  });
+  // clang-format on
 }
 
 TEST(AudioDescriptions, LabelTextsComeFromKeysNamedAfterTheLabel) {
   struct Case {
     AudioChannelLabel label;
-    const char* name;
-    const char* abbreviation;  // null where it is not localized
+    const char *name, *abbreviation;  // abbreviation null where it is not localized
   };
+  // clang-format off
   const Case kCases[] = {
       {L::Discrete, "Discrete", nullptr},          {L::FrontLeft, "FrontLeft", "L"},
       {L::TopFrontRight, "TopFrontRight", "Vhr"},  {L::TopFrontCenter, "TopFrontCenter", "Vhc"},
       {L::LeftHeight, "LeftHeight", "Tsl"},        {L::LFE2, "LFE2", "LFE2"},
       {L::ProximityRight, "ProximityRight", "Pr"}, {L::AmbisonicsHOA, "AmbisonicsHOA", nullptr},
   };
+  // clang-format on
+  const std::string p = "$$$/zebmediatypes/AudioChannelLabel";
   for (const Case& c : kCases) {
     SCOPED_TRACE(c.name);
     zebcore::config::Localizer::Translations translations = {
-        {std::string("$$$/zebmediatypes/AudioChannelLabel/") + c.name, u"description"},
-        {std::string("$$$/zebmediatypes/AudioChannelLabelMnemonic/") + c.name, u"&mnemonic"}};
-    if (c.abbreviation != nullptr) {
-      translations[std::string("$$$/zebmediatypes/AudioChannelLabelAbbreviations/") +
-                   c.abbreviation] = u"abbreviation";
-    }
+        {p + "/" + c.name, u"description"}, {p + "Mnemonic/" + c.name, u"&mnemonic"}};
+    if (c.abbreviation != nullptr)
+      translations[p + "Abbreviations/" + c.abbreviation] = u"abbreviation";
     const ScopedTranslations installed(std::move(translations));
     EXPECT_EQ(Narrow(AudioChannelLabelDescription(c.label, false)), "description");
     EXPECT_EQ(Narrow(AudioChannelLabelDescription(c.label, true)), "&mnemonic");
