@@ -274,15 +274,15 @@ TEST(FrameRate, MatchedFrameRateFromFloat) {
 
 TEST(FrameRate, IsFrameRateAudioCoversOnlyTheHighSampleRates) {
   // clang-format off
-  for (FrameRate r : {kFrameRate_Audio22050, kFrameRate_Audio32000, kFrameRate_Audio44100, kFrameRate_Audio48000,
-                      kFrameRate_Audio88200, kFrameRate_Audio96000, kFrameRate_Audio192000}) {
-    EXPECT_TRUE(IsFrameRateAudio(r)) << r.GetTicksPerFrame();
-  }
-  for (FrameRate r : {kFrameRate_Audio8000, kFrameRate_Audio11025, kFrameRate_Audio16000, kFrameRate_Video48,
-                      kFrameRate_Milliseconds, kFrameRate_Invalid}) {
-    EXPECT_FALSE(IsFrameRateAudio(r)) << r.GetTicksPerFrame();
-  }
+  const std::pair<FrameRate, bool> kCases[] = {
+      {kFrameRate_Audio22050, true}, {kFrameRate_Audio32000, true}, {kFrameRate_Audio44100, true}, {kFrameRate_Audio48000, true},
+      {kFrameRate_Audio88200, true}, {kFrameRate_Audio96000, true}, {kFrameRate_Audio192000, true}, {kFrameRate_Audio8000, false},
+      {kFrameRate_Audio11025, false}, {kFrameRate_Audio16000, false}, {kFrameRate_Video48, false},
+      {kFrameRate_Milliseconds, false}, {kFrameRate_Invalid, false}};
   // clang-format on
+  for (const auto& [rate, audio] : kCases) {
+    EXPECT_EQ(IsFrameRateAudio(rate), audio) << rate.GetTicksPerFrame();
+  }
 }
 
 TEST(FrameRate, TextForms) {
