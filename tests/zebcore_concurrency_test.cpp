@@ -9,6 +9,7 @@
 
 #include <atomic>
 #include <chrono>
+#include <functional>
 #include <string>
 #include <thread>
 #include <vector>
@@ -16,11 +17,18 @@
 namespace {
 
 using zebcore::UTF16String;
+using zebcore::threads::RecursiveLockGuard;
+using zebcore::threads::RecursiveMutex;
+
+void RunThreads(int count, const std::function<void()>& body) {
+  std::vector<std::thread> threads;
+  for (int t = 0; t < count; ++t) threads.emplace_back(body);
+  for (auto& t : threads) t.join();
+}
 
 TEST(RecursiveMutex, LockTimesOutWhileAnotherThreadHoldsIt) {
-  zebcore::threads::RecursiveMutex mutex("held");
-  std::atomic<bool> held{false};
-  std::atomic<bool> release{false};
+  RecursiveMutex mutex("held");
+  std::atomic<bool> held{false}, release{false};
   std::thread holder([&] {
     ASSERT_TRUE(mutex.Lock("holder", 1000));
     held = true;
@@ -33,10 +41,7 @@ TEST(RecursiveMutex, LockTimesOutWhileAnotherThreadHoldsIt) {
   zebcore::logging::SetTraceSink(
       [&](std::string_view, int, std::string_view text) { traced.emplace_back(text); }, 1);
   EXPECT_FALSE(mutex.Lock("waiter", 20));
-  {
-    zebcore::threads::RecursiveLockGuard guard(mutex, "guard", 0);
-    EXPECT_FALSE(guard);
-  }
+  EXPECT_FALSE(RecursiveLockGuard(mutex, "guard", 0));
   zebcore::logging::SetTraceSink({}, 0);
   ASSERT_EQ(traced.size(), 2u);
   EXPECT_NE(traced[0].find("waiter"), std::string::npos);
@@ -49,46 +54,37 @@ TEST(RecursiveMutex, LockTimesOutWhileAnotherThreadHoldsIt) {
 }
 
 TEST(RecursiveMutex, AnotherThreadCannotUnlockIt) {
-  zebcore::threads::RecursiveMutex mutex("owned");
+  RecursiveMutex mutex("owned");
   ASSERT_TRUE(mutex.Lock("owner", 0));
   zebcore::debug::ScopedAssertionCapture capture;
-  std::thread intruder([&] {
+  RunThreads(1, [&] {
     mutex.Unlock();
     EXPECT_FALSE(mutex.Lock("intruder", 10));  // still held by the owner
   });
-  intruder.join();
   EXPECT_EQ(capture.Count(), 1u);
   mutex.Unlock();
 }
 
 TEST(RecursiveMutex, SerializesHolders) {
-  zebcore::threads::RecursiveMutex mutex;
+  RecursiveMutex mutex;
   long counter = 0;
-  std::vector<std::thread> threads;
-  for (int t = 0; t < 4; ++t) {
-    threads.emplace_back([&] {
-      for (int i = 0; i < 1000; ++i) {
-        zebcore::threads::RecursiveLockGuard outer(mutex, "outer", 60000);
-        zebcore::threads::RecursiveLockGuard inner(mutex, "inner", 60000);
-        ++counter;
-      }
-    });
-  }
-  for (auto& t : threads) t.join();
+  RunThreads(4, [&] {
+    for (int i = 0; i < 1000; ++i) {
+      RecursiveLockGuard outer(mutex, "outer", 60000);
+      RecursiveLockGuard inner(mutex, "inner", 60000);
+      ++counter;
+    }
+  });
   EXPECT_EQ(counter, 4000);
 }
 
 TEST(ScopedAssertionCapture, CapturesReportsFromOtherThreads) {
   zebcore::debug::ScopedAssertionCapture capture;
-  std::vector<std::thread> threads;
-  for (int t = 0; t < 4; ++t) {
-    threads.emplace_back([] {
-      for (int i = 0; i < 100; ++i) {
-        zebcore::debug::ReportAssertion("x", "from a thread", __FILE__, "worker", __LINE__);
-      }
-    });
-  }
-  for (auto& t : threads) t.join();
+  RunThreads(4, [] {
+    for (int i = 0; i < 100; ++i) {
+      zebcore::debug::ReportAssertion("x", "from a thread", __FILE__, "worker", __LINE__);
+    }
+  });
   EXPECT_EQ(capture.Count(), 400u);
   EXPECT_EQ(capture.LastMessage(), "from a thread");
 }
@@ -101,25 +97,20 @@ class Nop final : public zebcore::console::Command {
 TEST(CommandRegistry, StaysConsistentUnderConcurrentUse) {
   auto& registry = zebcore::console::CommandRegistry::Get();
   std::atomic<int> registered{0};
-  std::vector<std::thread> threads;
-  for (int t = 0; t < 4; ++t) {
-    threads.emplace_back([&, t] {
-      for (int i = 0; i < 200; ++i) {
-        // Every thread races for the same few names.
-        const UTF16String name =
-            u"zebcore.race." + UTF16String(1, static_cast<char16_t>(u'a' + i % 5));
-        if (registry.RegisterCommand(name, u"", [] { return std::make_shared<Nop>(); })) {
-          ++registered;
-        }
-        zebcore::string::oUTF16StringStream out;
-        registry.Execute(name, u"", out);
-        if (registry.UnregisterCommand(name)) --registered;
-        (void)registry.Commands();
-        (void)t;
+  RunThreads(4, [&] {
+    for (int i = 0; i < 200; ++i) {
+      // Every thread races for the same few names.
+      const UTF16String name =
+          u"zebcore.race." + UTF16String(1, static_cast<char16_t>(u'a' + i % 5));
+      if (registry.RegisterCommand(name, u"", [] { return std::make_shared<Nop>(); })) {
+        ++registered;
       }
-    });
-  }
-  for (auto& t : threads) t.join();
+      zebcore::string::oUTF16StringStream out;
+      registry.Execute(name, u"", out);
+      if (registry.UnregisterCommand(name)) --registered;
+      (void)registry.Commands();
+    }
+  });
   EXPECT_EQ(registered.load(), 0);
   for (const auto& entry : registry.Commands()) {
     EXPECT_NE(entry.name.rfind(u"zebcore.race.", 0), 0u);

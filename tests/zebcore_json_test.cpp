@@ -4,7 +4,6 @@
 #include <zebcore/assert.h>
 #include <zebcore/json.h>
 
-#include <cfloat>
 #include <cmath>
 #include <cstdint>
 #include <cstring>
@@ -27,111 +26,58 @@ std::string Print(const boost::any& value, bool pretty = false) {
 
 UTF8String U8(const char* s) { return zebcore::string::ToUTF8String(s); }
 
-TEST(JSONParse, GivesEachValueItsType) {
-  struct Case {
-    const char* text;
-    const std::type_info& type;
-  };
+TEST(JSONParse, GivesEachValueItsTypeAndKeepsIntegersExact) {
+  // clang-format off
+  struct Case { const char* text; const std::type_info& type; const char* printed; };
   const Case kCases[] = {
-      {"{}", typeid(JSONObject)},
-      {"[]", typeid(JSONArray)},
-      {"0", typeid(std::int64_t)},
-      {"-0", typeid(std::int64_t)},
-      {"9223372036854775807", typeid(std::int64_t)},
-      {"-9223372036854775808", typeid(std::int64_t)},
-      {"9223372036854775808", typeid(std::uint64_t)},
-      {"18446744073709551615", typeid(std::uint64_t)},
-      {"1.5", typeid(double)},
-      {"1e2", typeid(double)},
-      {"-0.0", typeid(double)},
-      {"true", typeid(bool)},
-      {"false", typeid(bool)},
-      {"\"text\"", typeid(UTF8String)},
-      {" \t\r\n 7 \n", typeid(std::int64_t)},
+      {"{}", typeid(JSONObject), "{}"},
+      {"{\"a\":1,\"a\":2}", typeid(JSONObject), "{\"a\":2}"},  // a repeated key: the last
+      {"null", typeid(void), "null"},  // a document that is JSON null is not a failure
+      {"-0", typeid(std::int64_t), "0"},
+      {"9223372036854775807", typeid(std::int64_t), "9223372036854775807"},
+      {"-9223372036854775808", typeid(std::int64_t), "-9223372036854775808"},
+      {"9223372036854775808", typeid(std::uint64_t), "9223372036854775808"},
+      {"18446744073709551615", typeid(std::uint64_t), "18446744073709551615"},
+      {"1e2", typeid(double), "100.0"},
+      {"-0.0", typeid(double), "-0.0"},
+      {"1e-400", typeid(double), "0.0"},  // tiny numbers underflow towards zero
+      {"true", typeid(bool), "true"},
+      {" \t\r\n \"text\" \n", typeid(UTF8String), "\"text\""},
   };
+  // clang-format on
   for (const Case& c : kCases) {
     SCOPED_TRACE(c.text);
     const JSONValue value = Parse(c.text);
     ASSERT_TRUE(value);
     EXPECT_EQ(value->type(), c.type);
+    EXPECT_EQ(Print(*value), c.printed);
   }
-  const JSONValue null = Parse("null");
-  ASSERT_TRUE(null);  // a document that is JSON null is not a failure
-  EXPECT_TRUE(null->empty());
 }
 
-TEST(JSONParse, KeepsIntegersExact) {
-  EXPECT_EQ(boost::any_cast<std::int64_t>(*Parse("-9223372036854775808")),
-            std::numeric_limits<std::int64_t>::min());
-  EXPECT_EQ(boost::any_cast<std::uint64_t>(*Parse("18446744073709551615")),
-            std::numeric_limits<std::uint64_t>::max());
-  EXPECT_EQ(boost::any_cast<std::int64_t>(*Parse("254016000000")), 254016000000);
-}
-
-TEST(JSONParse, RejectsMalformedText) {
+TEST(JSONParse, RejectsMalformedTextAndNumbersOutsideTheirRanges) {
+  // clang-format off
   const std::string kCases[] = {
-      "",
-      " ",
-      "{",
-      "}",
-      "[1,",
-      "[1,]",
-      "{\"a\":}",
-      "{\"a\" 1}",
-      "{\"a\":1,}",
-      "{a:1}",
-      "{'a':1}",
-      "tru",
-      "nul",
-      "True",
-      "01",
-      "1.",
-      ".5",
-      "+1",
-      "0x10",
-      "NaN",
-      "Infinity",
-      "-Infinity",
-      "\"unterminated",
-      "\"bad \\x escape\"",
-      "\"\\u12\"",
-      "\"\\ud800\"",  // a lone surrogate escape
-      "\"\\udc00\\ud800\"",
-      "\"a\x01z\"",  // a raw control character
-      "\"\xFF\"",    // invalid UTF-8
-      "\"\xC3\"",
-      "\"\xED\xA0\x80\"",  // an encoded surrogate
-      "[1] [2]",           // two documents
-      "{} x",
-      "/* comment */ 1",
-      "[1 2]",
+      "", " ", "{", "}", "[1,", "[1,]", "[1 2]", "{\"a\":}", "{\"a\" 1}", "{\"a\":1,}", "{a:1}",
+      "{'a':1}", "tru", "nul", "True", "/* comment */ 1",
+      "[1] [2]", "{} x",                                        // two documents
+      std::string("{\"a\"\0:1}", 8), std::string("\0{}", 3),   // a zero byte ends the text
+      "01", "1.", ".5", "+1", "0x10", "NaN", "Infinity", "-Infinity",
+      "\"unterminated", "\"bad \\x escape\"", "\"\\u12\"",
+      "\"\\ud800\"", "\"\\udc00\\ud800\"",                      // lone surrogate escapes
+      "\"a\x01z\"",                                             // a raw control character
+      "\"\xFF\"", "\"\xC3\"", "\"\xED\xA0\x80\"",               // invalid UTF-8
+      "18446744073709551616", "-9223372036854775809", "123456789012345678901234567890",
+      "-123456789012345678901234567890", "[1, 99999999999999999999]",
+      "{\"ticks\": 1000000000000000000000000}", "1e400", "-1e400", "[1.7976931348623159e308]",
   };
+  // clang-format on
   for (const std::string& text : kCases) {
     SCOPED_TRACE(::testing::PrintToString(text));
     EXPECT_FALSE(Parse(text));
   }
-}
-
-TEST(JSONParse, RejectsNumbersOutsideTheirRanges) {
-  const char* const kCases[] = {
-      "18446744073709551616",
-      "-9223372036854775809",
-      "123456789012345678901234567890",
-      "-123456789012345678901234567890",
-      "[1, 99999999999999999999]",
-      "{\"ticks\": 1000000000000000000000000}",
-      "1e400",
-      "-1e400",
-      "[1.7976931348623159e308]",
-  };
-  for (const char* text : kCases) {
-    SCOPED_TRACE(text);
-    EXPECT_FALSE(Parse(text));
-  }
-  // Tiny numbers underflow towards zero; they are numbers.
-  const JSONValue tiny = Parse("1e-400");
-  ASSERT_TRUE(tiny);
-  EXPECT_EQ(boost::any_cast<double>(*tiny), 0.0);
+  EXPECT_FALSE(JSONParse(nullptr, 10));
+  EXPECT_TRUE(Parse(std::string("{\"a\":1}\0", 8)));
+  EXPECT_TRUE(Parse(std::string("[2]\0garbage", 11)));
 }
 
 TEST(JSONParse, LimitsNesting) {
@@ -172,24 +118,7 @@ TEST(JSONParse, RejectsEveryTruncation) {
   }
 }
 
-TEST(JSONParse, AZeroByteEndsTheText) {
-  const std::string withTerminator("{\"a\":1}\0", 8);
-  EXPECT_TRUE(Parse(withTerminator));
-  EXPECT_TRUE(Parse(std::string("[2]\0garbage", 11)));
-  EXPECT_FALSE(Parse(std::string("{\"a\"\0:1}", 8)));
-  EXPECT_FALSE(Parse(std::string("\0{}", 3)));
-  EXPECT_FALSE(JSONParse(nullptr, 10));
-}
-
-TEST(JSONParse, RepeatedKeyKeepsTheLastValue) {
-  const JSONValue value = Parse("{\"a\":1,\"a\":2}");
-  ASSERT_TRUE(value);
-  std::int64_t a = 0;
-  ASSERT_TRUE(GetJSONInt64(*GetVariantInObject(*value, "a"), a));
-  EXPECT_EQ(a, 2);
-}
-
-TEST(GetJSONUTF8String, WritesCompactTextInKeyOrder) {
+TEST(GetJSONUTF8String, WritesMembersInKeyOrderCompactOrIndented) {
   boost::any object;
   AddToObject(object, "zebra", std::int64_t{-5}, false);
   AddToObject(object, "alpha", true, false);
@@ -206,32 +135,31 @@ TEST(GetJSONUTF8String, WritesCompactTextInKeyOrder) {
             "{\"alpha\":true,\"big\":18446744073709551615,\"list\":[1,{},[]],"
             "\"mid\":\"q\\\"\\\\/\\b\\f\\n\\r\\t\\u0001\\u001f\xC3\xA9\",\"none\":null,"
             "\"num\":0.1,\"whole\":25.0,\"zebra\":-5}");
+  boost::any pretty;
+  AddToObject(pretty, "a", std::int64_t{1}, false);
+  AddToObject(pretty, "b", JSONArray{std::make_shared<boost::any>(true)}, false);
+  EXPECT_EQ(Print(pretty, true), "{\n  \"a\": 1,\n  \"b\": [\n    true\n  ]\n}");
 }
 
 TEST(GetJSONUTF8String, WritesValidTextForAnyValue) {
-  struct Case {
-    boost::any value;
-    const char* text;
-  };
+  // clang-format off
+  struct Case { boost::any value; const char* text; };
   const Case kCases[] = {
       {std::numeric_limits<double>::quiet_NaN(), "null"},  // JSON has no NaN
-      {HUGE_VAL, "null"},
-      {std::numeric_limits<std::int64_t>::min(), "-9223372036854775808"},
       {U8("bad \xFF\xC3 utf8"), "\"bad \xEF\xBF\xBD\xEF\xBF\xBD utf8\""},
       {std::string("narrow"), "\"narrow\""},
       {42, "42"},
       {1.5f, "1.5"},
+      {1e300, "1e+300"},
       {JSONValue(), "null"},
       {std::make_shared<boost::any>(std::int64_t{3}), "3"},
       {std::vector<int>{1}, "null"},  // not a JSON type
-      {1e300, "1e+300"},
-      {-0.0, "-0.0"},
   };
+  // clang-format on
   for (const Case& c : kCases) {
     SCOPED_TRACE(c.text);
-    const std::string text = Print(c.value);
-    EXPECT_EQ(text, c.text);
-    EXPECT_TRUE(Parse(text));
+    EXPECT_EQ(Print(c.value), c.text);
+    EXPECT_TRUE(Parse(Print(c.value)));
   }
 }
 
@@ -256,13 +184,11 @@ TEST(GetJSONUTF8String, PrintedTextParsesToTheSameText) {
     SCOPED_TRACE(text);
     const JSONValue first = Parse(text);
     ASSERT_TRUE(first);
-    const std::string printed = Print(*first);
-    const JSONValue second = Parse(printed);
-    ASSERT_TRUE(second);
-    EXPECT_EQ(Print(*second), printed);
-    const JSONValue pretty = Parse(Print(*first, true));
-    ASSERT_TRUE(pretty);
-    EXPECT_EQ(Print(*pretty), printed);
+    for (bool pretty : {false, true}) {
+      const JSONValue again = Parse(Print(*first, pretty));
+      ASSERT_TRUE(again);
+      EXPECT_EQ(Print(*again), Print(*first));
+    }
   }
 }
 
@@ -283,29 +209,17 @@ TEST(GetJSONUTF8String, DoublesRoundTripBitForBit) {
   }
 }
 
-TEST(GetJSONUTF8String, PrettyTextIndentsMembers) {
-  boost::any object;
-  AddToObject(object, "a", std::int64_t{1}, false);
-  AddToObject(object, "b", JSONArray{std::make_shared<boost::any>(true)}, false);
-  EXPECT_EQ(Print(object, true), "{\n  \"a\": 1,\n  \"b\": [\n    true\n  ]\n}");
-}
-
-TEST(AddToObject, ReplacesOnlyWhenAsked) {
+TEST(AddToObject, ReplacesOnlyWhenAskedAndRefusesANonObject) {
   boost::any object;  // empty: becomes an object
   EXPECT_TRUE(AddToObject(object, "k", std::int64_t{1}, false));
   EXPECT_FALSE(AddToObject(object, "k", std::int64_t{2}, false));
-  std::int64_t k = 0;
-  ASSERT_TRUE(GetJSONInt64(*GetVariantInObject(object, "k"), k));
-  EXPECT_EQ(k, 1);
+  EXPECT_EQ(Print(object), "{\"k\":1}");
   EXPECT_TRUE(AddToObject(object, U8("k"), std::int64_t{3}, true));
-  ASSERT_TRUE(GetJSONInt64(*GetVariantInObject(object, "k"), k));
-  EXPECT_EQ(k, 3);
+  EXPECT_EQ(Print(*GetVariantInObject(object, "k")), "3");
   EXPECT_TRUE(ObjectHasProperty(object, "k"));
   EXPECT_FALSE(ObjectHasProperty(object, "K"));
   EXPECT_FALSE(GetVariantInObject(object, "missing"));
-}
 
-TEST(AddToObject, RefusesAValueThatIsNoObject) {
   boost::any number = std::int64_t{5};
   zebcore::debug::ScopedAssertionCapture capture;
   EXPECT_FALSE(AddToObject(number, "k", true, false));
@@ -316,20 +230,17 @@ TEST(AddToObject, RefusesAValueThatIsNoObject) {
 }
 
 TEST(GetJSONInt64, ReadsOnlyIntegersThatFit) {
-  struct Case {
-    boost::any value;
-    bool ok;
-    std::int64_t expected;
-  };
+  // clang-format off
+  struct Case { boost::any value; bool ok; std::int64_t expected; };
   const Case kCases[] = {
       {std::int64_t{-7}, true, -7},
       {std::uint64_t{9223372036854775807ULL}, true, std::numeric_limits<std::int64_t>::max()},
       {std::uint64_t{9223372036854775808ULL}, false, 0},
       {1.0, false, 0},
-      {true, false, 0},
       {U8("1"), false, 0},
       {boost::any(), false, 0},
   };
+  // clang-format on
   for (std::size_t i = 0; i < std::size(kCases); ++i) {
     SCOPED_TRACE(i);
     std::int64_t out = 0;
