@@ -164,16 +164,19 @@ TEST(SelectSameBitDepthRGBPixelFormat, KeepsDepthAndAlpha) {
   }
 }
 
-TEST(DVPixelFormat, FixedGeometryAndDecompressionTarget) {
+TEST(DVPixelFormat, FixedGeometrySizeRatiosAndDecompressionTarget) {
   const PixelFormat yuyv709 = kPixelFormat_YUYV_422_8u_709;
   // clang-format off
-  struct Case { PixelFormat format; int width, height; PixelFormat target; };
+  struct Case { PixelFormat format; int width, height; std::uint64_t size; PixelAspectRatio ratio, wide; PixelFormat target; };
   const Case kCases[] = {
-      {kPixelFormat_NTSCDV25, 720, 480, kUYVY}, {kPixelFormat_PALDV25, 720, 576, kUYVY},
-      {kPixelFormat_NTSCDV50, 720, 480, kYUYV}, {kPixelFormat_PALDV50, 720, 576, kYUYV},
-      {kPixelFormat_NTSC_DV100_720p, 960, 720, yuyv709}, {kPixelFormat_PAL_DV100_720p, 960, 720, yuyv709},
-      {kPixelFormat_NTSC_DV100_1080i, 1280, 1080, yuyv709}, {kPixelFormat_PAL_DV100_1080i, 1440, 1080, yuyv709},
-      {kBGRA, 123, -4, kBGRA}, {kAny, 123, -4, kAny},  // not DV: left alone
+      {kPixelFormat_NTSCDV25, 720, 480, 120000, {10, 11}, {40, 33}, kUYVY},
+      {kPixelFormat_PALDV25, 720, 576, 144000, {768, 702}, {1024, 702}, kUYVY},
+      {kPixelFormat_NTSCDV50, 720, 480, 240000, {10, 11}, {40, 33}, kYUYV},
+      {kPixelFormat_PALDV50, 720, 576, 288000, {768, 702}, {1024, 702}, kYUYV},
+      {kPixelFormat_NTSC_DV100_720p, 960, 720, 240000, {1, 1}, {1, 1}, yuyv709},
+      {kPixelFormat_PAL_DV100_720p, 960, 720, 288000, {1, 1}, {1, 1}, yuyv709},
+      {kPixelFormat_NTSC_DV100_1080i, 1280, 1080, 480000, {3, 2}, {3, 2}, yuyv709},
+      {kPixelFormat_PAL_DV100_1080i, 1440, 1080, 576000, {4, 3}, {1920, 1440}, yuyv709},
   };
   // clang-format on
   for (const Case& c : kCases) {
@@ -184,6 +187,26 @@ TEST(DVPixelFormat, FixedGeometryAndDecompressionTarget) {
     EXPECT_EQ(width, c.width);
     EXPECT_EQ(height, c.height);
     EXPECT_EQ(SelectDVDecompressionFormat(c.format), c.target);
+    // A DV frame has a fixed size whatever dimensions are asked for.
+    EXPECT_EQ(PixelFormatSize(c.format, c.width, c.height), c.size);
+    EXPECT_EQ(PixelFormatSize(c.format, 1, 1), c.size);
+    EXPECT_EQ(UncompressedPixelFormatRowBytes(c.format, c.width), 0u);
+    // Only its own size with a permitted ratio is valid; a legacy 9:10 never is.
+    EXPECT_TRUE(IsRectValidForFormat(c.format, c.width, c.height, c.ratio));
+    EXPECT_TRUE(IsRectValidForFormat(c.format, c.width, c.height, c.wide));
+    EXPECT_FALSE(IsRectValidForFormat(c.format, c.width, c.height + 6, c.ratio));
+    EXPECT_FALSE(IsRectValidForFormat(c.format, c.width - 1, c.height, c.ratio));
+    EXPECT_FALSE(IsRectValidForFormat(c.format, c.width, c.height, {648, 720}));
+    EXPECT_FALSE(IsRectValidForFormat(c.format, c.width, c.height, kPixelAspectRatio_Any));
+  }
+  // Other formats have no fixed geometry: anything goes and nothing changes.
+  for (const PixelFormat& pf : {kBGRA, kAny, kInvalid}) {
+    int width = 123;
+    int height = -4;
+    FixedSizedFormatDimensions(pf, width, height);
+    EXPECT_TRUE(width == 123 && height == -4);
+    EXPECT_EQ(SelectDVDecompressionFormat(pf), pf);
+    EXPECT_TRUE(IsRectValidForFormat(pf, -5, 0, {7, 0}));
   }
 }
 
@@ -263,8 +286,6 @@ TEST(PixelFormatSize, GoldenRowBytesAndSizes) {
       {kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_8u_709, 480, 360, 0, 276992},
       {kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_10u_as16u_709, 480, 360, 0, 553984},
       {kPixelFormat_YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_601, 480, 360, 0, 295168},
-      {kPixelFormat_NTSCDV25, 720, 480, 0, 120000}, {kPixelFormat_NTSCDV25, 1920, 1080, 0, 120000},
-      {kPixelFormat_PAL_DV100_1080i, 1, 1, 0, 576000},
       {kAny, 480, 360, 0, 0}, {kInvalid, 480, 360, 0, 0},
       {kPixelFormat_BGRA_4444_32f, INT_MAX, 1, 34359738368u, 34359738368u},  // no 32-bit wrap
   };
@@ -341,27 +362,6 @@ TEST(PixelFormatSize, ZeroAndNegativeDimensionsGiveZero) {
       EXPECT_EQ(PixelFormatSize(*pf, width, height), 0u);
       EXPECT_TRUE(width > 0 || UncompressedPixelFormatRowBytes(*pf, width) == 0);
     }
-  }
-}
-
-TEST(IsRectValidForFormat, DVNeedsItsSizeAndAPermittedRatio) {
-  // clang-format off
-  struct Case { PixelFormat format; int width, height; PixelAspectRatio par; bool valid; };
-  const Case kCases[] = {
-      {kPixelFormat_NTSCDV25, 720, 480, {10, 11}, true}, {kPixelFormat_NTSCDV25, 720, 480, {40, 33}, true},
-      {kPixelFormat_NTSCDV25, 720, 486, {10, 11}, false}, {kPixelFormat_NTSCDV25, 720, 480, {1, 1}, false},
-      {kPixelFormat_NTSCDV25, 720, 480, {648, 720}, false},  // a legacy ratio is not permitted
-      {kPixelFormat_PALDV50, 720, 576, {1024, 702}, true},
-      {kPixelFormat_NTSC_DV100_1080i, 1280, 1080, {3, 2}, true},
-      {kPixelFormat_PAL_DV100_1080i, 1440, 1080, {4, 3}, true},
-      {kPixelFormat_NTSC_DV100_720p, 960, 720, {1, 1}, true},
-      {kPixelFormat_NTSC_DV100_720p, 960, 720, {0, 1}, false},
-      {kBGRA, -5, 0, {0, 0}, true}, {kInvalid, 1, 1, {7, 0}, true},
-  };
-  // clang-format on
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(testing::Message() << c.format.fourCC << " " << c.width << "x" << c.height);
-    EXPECT_EQ(IsRectValidForFormat(c.format, c.width, c.height, c.par), c.valid);
   }
 }
 
