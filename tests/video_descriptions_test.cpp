@@ -5,6 +5,7 @@
 
 #include <sstream>
 #include <string>
+#include <utility>
 
 namespace zebmediatypes {
 namespace {
@@ -13,16 +14,9 @@ std::string Text(const zebcore::UTF16String& s) {
   return zebcore::string::UTF16toNarrow(zebcore::string::View(s));
 }
 
-PixelFormatName Name(const char* text) {
-  return MakePixelFormatName(text[0], text[1], text[2], text[3]);
-}
-
 TEST(PixelFormatDescription, NamesTheLayoutInWords) {
-  struct Case {
-    PixelFormat format;
-    const char* text;
-  };
-  const Case kCases[] = {
+  // clang-format off
+  const std::pair<PixelFormat, const char*> kCases[] = {
       {kPixelFormat_BGRA_4444_8u, "BGRA 4444 8u Full Range"},
       {kPixelFormat_VUYA_4444_8u, "VUYA 4444 8u 601"},
       {kPixelFormat_VUYA_4444_8u_709, "VUYA 4444 8u 709"},
@@ -39,29 +33,25 @@ TEST(PixelFormatDescription, NamesTheLayoutInWords) {
       {kPixelFormat_PAL_DV100_1080i, "PAL DV 100 (1080i)"},
       {kPixelFormat_PALDV50, "PAL DV 50"},
       {kPixelFormat_YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_601, "YUV 420 MPEG2 Frame 8u 601"},
-      {kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_8u_709_FullRange,
-       "YUV 420 MPEG4 Frame BiPlanar 8u 709 Full Range"},
-      {kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_10u_as16u_2020_HDR,
-       "YUV 420 MPEG4 Frame BiPlanar 10u 2020 HDR"},
+      {kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_8u_709_FullRange, "YUV 420 MPEG4 Frame BiPlanar 8u 709 Full Range"},
+      {kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_10u_as16u_2020_HDR, "YUV 420 MPEG4 Frame BiPlanar 10u 2020 HDR"},
       {kPixelFormat_YUV_420_MPEG4_FIELD_PICTURE_PLANAR_8u_601, "YUV 420 MPEG4 Field 8u 601"},
       {kPixelFormat_Any, "Any Pixel Format"},
       {kPixelFormat_Invalid, "Unknown Pixel Format"},
-      {PixelFormat(Name("_abc"), kPixelFormat_BGRA_4444_8u.properties),
-       "Custom Pixel Format (cba_)"},
-      {PixelFormat(Name("@\x01\x80z"), kPixelFormatProperties_Invalid),
-       "Custom Pixel Format (z? @)"},
-      {PixelFormat(Name("qqqq"), PixelFormatProperties(0x000F8001)),
-       "Unknown Compressed Pixel Format (qqqq)"},
+      {PixelFormat(MakePixelFormatName("_abc"), kPixelFormat_BGRA_4444_8u.properties), "Custom Pixel Format (cba_)"},
+      {PixelFormat(MakePixelFormatName("@\x01\x80z"), kPixelFormatProperties_Invalid), "Custom Pixel Format (z? @)"},
+      {PixelFormat(MakePixelFormatName("qqqq"), PixelFormatProperties(0x000F8001)), "Unknown Compressed Pixel Format (qqqq)"},
   };
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.text);
-    EXPECT_EQ(Text(PixelFormatDescription(c.format)), c.text);
+  // clang-format on
+  for (const auto& [format, text] : kCases) {
+    SCOPED_TRACE(text);
+    EXPECT_EQ(Text(PixelFormatDescription(format)), text);
     std::ostringstream narrow;
-    narrow << c.format;
-    EXPECT_EQ(narrow.str(), c.text);
+    narrow << format;
+    EXPECT_EQ(narrow.str(), text);
     zebcore::string::oUTF16StringStream wide;
-    wide << c.format;
-    EXPECT_EQ(Text(wide.str()), c.text);
+    wide << format;
+    EXPECT_EQ(Text(wide.str()), text);
   }
 }
 
@@ -85,68 +75,40 @@ TEST(PixelFormatDescription, UsesTheLocalizer) {
 }
 
 TEST(GetFourCCDescriptiveName, GivesTheCatalogueNameOrInvalid) {
-  struct Case {
-    std::uint32_t name;
-    const char* text;
+  // clang-format off
+  const std::pair<const char*, const char*> kCases[] = {
+      {"nv12", "NV12_MPEG4_FRAME_709"}, {"Nv16", "P210_422_BIPLANAR_10"}, {"POi0", "P010_MPEG4_FIELD_HDR"},
+      {"Phl0", "P010_MPEG4_FIELD_HDR_HLG"}, {"vuya", "VUYA_4444_8u"}, {"PHLf", "P010_MPEG4_FRAME_FullRange_HLG"},
+      {"v21f", "Invalid"}, {"y210", "Invalid"}, {"y21f", "Invalid"}, {"zzzz", "Invalid"}, {"_abc", "Invalid"},
+      {"badf", "Invalid"}, {"\0\0\0\0", "Invalid"},
   };
-  const Case kCases[] = {
-      {Name("nv12"), "NV12_MPEG4_FRAME_709"},
-      {Name("Nv16"), "P210_422_BIPLANAR_10"},
-      {Name("POi0"), "P010_MPEG4_FIELD_HDR"},
-      {Name("Phl0"), "P010_MPEG4_FIELD_HDR_HLG"},
-      {Name("vuya"), "VUYA_4444_8u"},
-      {Name("PHLf"), "P010_MPEG4_FRAME_FullRange_HLG"},
-      {Name("v21f"), "Invalid"},
-      {Name("y210"), "Invalid"},
-      {Name("y21f"), "Invalid"},
-      {Name("zzzz"), "Invalid"},
-      {Name("_abc"), "Invalid"},
-      {0, "Invalid"},
-      {kPixelFormatFourCC_Invalid, "Invalid"},
-  };
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.text);
-    EXPECT_EQ(zebcore::string::ToStdString(
-                  GetFourCCDescriptiveName(static_cast<PixelFormatName>(c.name))),
-              c.text);
+  // clang-format on
+  for (const auto& [name, text] : kCases) {
+    SCOPED_TRACE(text);
+    const PixelFormatName fourCC = MakePixelFormatName(name[0], name[1], name[2], name[3]);
+    EXPECT_EQ(zebcore::string::ToStdString(GetFourCCDescriptiveName(fourCC)), text);
   }
 }
 
 TEST(AlphaDescription, NamesStraightAndPremultiplied) {
-  struct Case {
-    AlphaChannel alpha;
-    const char* text;
-  };
-  const Case kCases[] = {
-      {kAlphaChannel_Straight, "Straight Alpha"},
-      {kAlphaChannel_Premultiplied, "Premultiplied Alpha"},
-      {kAlphaChannel_None, "None"},
-      {static_cast<AlphaChannel>(3), "None"},
-      {static_cast<AlphaChannel>(-1), "None"},
-  };
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.text);
-    EXPECT_EQ(Text(AlphaDescription(c.alpha)), c.text);
+  const std::pair<int, const char*> kCases[] = {
+      {1, "Straight Alpha"}, {2, "Premultiplied Alpha"}, {0, "None"}, {3, "None"}, {-1, "None"}};
+  for (const auto& [alpha, text] : kCases) {
+    SCOPED_TRACE(text);
+    EXPECT_EQ(Text(AlphaDescription(static_cast<AlphaChannel>(alpha))), text);
   }
 }
 
 TEST(FieldTypeDescription, LocalizedAndFixedTexts) {
-  struct Case {
-    int type;
-    const char* localized;
-    const char* fixed;
-  };
+  // clang-format off
+  struct Case { int type; const char* localized; const char* fixed; };
   const Case kCases[] = {
-      {0, "No Fields (Progressive Scan)", "Progressive Scan"},
-      {1, "Upper Field First", "Upper Field First"},
-      {2, "Lower Field First", "Lower Field First"},
-      {3, "Fields (Unknown Dominance)", "Unknown Dominance"},
-      {4, "Any Field Order", "Any Field Order"},
-      {-1, "Field Presence Unknown", "Field Presence Unknown"},
-      {5, "", ""},
-      {7, "", ""},
-      {-2, "", ""},
+      {0, "No Fields (Progressive Scan)", "Progressive Scan"}, {1, "Upper Field First", "Upper Field First"},
+      {2, "Lower Field First", "Lower Field First"}, {3, "Fields (Unknown Dominance)", "Unknown Dominance"},
+      {4, "Any Field Order", "Any Field Order"}, {-1, "Field Presence Unknown", "Field Presence Unknown"},
+      {5, "", ""}, {7, "", ""}, {-2, "", ""},
   };
+  // clang-format on
   for (const Case& c : kCases) {
     SCOPED_TRACE(c.type);
     const auto type = static_cast<FieldType>(c.type);
@@ -157,96 +119,66 @@ TEST(FieldTypeDescription, LocalizedAndFixedTexts) {
 }
 
 TEST(PixelAspectRatioDescription, NamesTheKnownRatios) {
-  struct Case {
-    PixelAspectRatio r;
-    const char* text;
-  };
-  const Case kCases[] = {
-      {{1, 1}, "Square Pixels (1.0)"},
-      {{10, 11}, "D1/DV NTSC (0.9091)"},
-      {{40, 33}, "D1/DV NTSC Widescreen 16:9 (1.2121)"},
-      {{768, 702}, "D1/DV PAL (1.0940)"},
-      {{1024, 702}, "D1/DV PAL Widescreen 16:9 (1.4587)"},
-      {{2, 1}, "Anamorphic 2:1 (2.0)"},
-      {{4, 3}, "HD Anamorphic 1080 (1.3333)"},
-      {{3, 2}, "DVCPRO HD (1.5)"},
-      {{9, 10}, "Other Aspect Ratio (0.9000)"},
-      {{648, 720}, "Other Aspect Ratio (0.9000)"},
+  // clang-format off
+  const std::pair<PixelAspectRatio, const char*> kCases[] = {
+      {{1, 1}, "Square Pixels (1.0)"}, {{10, 11}, "D1/DV NTSC (0.9091)"},
+      {{40, 33}, "D1/DV NTSC Widescreen 16:9 (1.2121)"}, {{768, 702}, "D1/DV PAL (1.0940)"},
+      {{1024, 702}, "D1/DV PAL Widescreen 16:9 (1.4587)"}, {{2, 1}, "Anamorphic 2:1 (2.0)"},
+      {{4, 3}, "HD Anamorphic 1080 (1.3333)"}, {{3, 2}, "DVCPRO HD (1.5)"},
+      {{9, 10}, "Other Aspect Ratio (0.9000)"}, {{648, 720}, "Other Aspect Ratio (0.9000)"},
       {{0, 1}, "Other Aspect Ratio (0.0000)"},
   };
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.text);
-    EXPECT_EQ(Text(PixelAspectRatioDescription(c.r)), c.text);
+  // clang-format on
+  for (const auto& [r, text] : kCases) {
+    SCOPED_TRACE(text);
+    EXPECT_EQ(Text(PixelAspectRatioDescription(r)), text);
   }
 }
 
 TEST(VideoFrameSizeDescription, ShowsTheRatioWhenKnown) {
-  EXPECT_EQ(Text(VideoFrameSizeDescription({10, 10, 720, 480}, kPixelAspectRatio_DVNTSC)),
-            "720w 480h (0.9091)");
-  EXPECT_EQ(Text(VideoFrameSizeDescription({10, 10, 720, 480}, kPixelAspectRatio_Any)),
-            "720w 480h");
-  EXPECT_EQ(Text(VideoFrameSizeDescription({10, 10, 720, 480}, kPixelAspectRatio_Unknown)),
-            "720w 480h");
-  EXPECT_EQ(Text(VideoFrameSizeDescription({0, 0, -1, 0}, kPixelAspectRatio_Square)),
-            "-1w 0h (1.0)");
+  // clang-format off
+  struct Case { zebcore::geom::RectT<int> rect; PixelAspectRatio r; const char* text; };
+  const Case kCases[] = {
+      {{10, 10, 720, 480}, kPixelAspectRatio_DVNTSC, "720w 480h (0.9091)"},
+      {{10, 10, 720, 480}, kPixelAspectRatio_Any, "720w 480h"},
+      {{10, 10, 720, 480}, kPixelAspectRatio_Unknown, "720w 480h"},
+      {{0, 0, -1, 0}, kPixelAspectRatio_Square, "-1w 0h (1.0)"},
+  };
+  // clang-format on
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.text);
+    EXPECT_EQ(Text(VideoFrameSizeDescription(c.rect, c.r)), c.text);
+  }
 }
 
 TEST(RenderQualityDescription, NamesTheFiveQualities) {
-  const char* kTexts[] = {"", "Draft", "Low", "Medium", "High", "Max", ""};
-  for (int q = 0; q <= 6; ++q) {
+  const char* kTexts[] = {"", "", "Draft", "Low", "Medium", "High", "Max", ""};  // from -1
+  for (int q = -1; q <= 6; ++q) {
     SCOPED_TRACE(q);
-    EXPECT_EQ(Text(RenderQualityDescription(static_cast<RenderQuality>(q))), kTexts[q]);
+    EXPECT_EQ(Text(RenderQualityDescription(static_cast<RenderQuality>(q))), kTexts[q + 1]);
   }
-  EXPECT_EQ(Text(RenderQualityDescription(static_cast<RenderQuality>(-1))), "");
 }
 
 TEST(GetCodecFamilyName, MatchesExactCodes) {
-  struct Case {
-    unsigned int code;
-    const char* family;
-  };
-  const Case kCases[] = {
-      {0x61766331, "H.264"},
-      {0x48323634, "H.264"},
-      {0x63766131, "unknown"},
-      {0, "unknown"},
-      {0xFFFFFFFF, "unknown"},
-      {0x4156646E, "DNxHD"},
-      {0x68647631, "HDV"},
-      {0x68647639, "HDV"},
-      {0x68647630, "unknown"},
-      {0x68647661, "HDV"},
-      {0x68647662, "unknown"},
-      {0x78643561, "XDCAM HD"},
-      {0x78643566, "XDCAM HD"},
-      {0x78643567, "unknown"},
-      {0x78647639, "XDCAM HD"},
-      {0x78647661, "XDCAM HD"},
-      {0x78647662, "XDCAM EX"},
-      {0x78647666, "XDCAM EX"},
-      {0x78647667, "unknown"},
-      {0x30357664, "DV"},
-      {0x64766320, "DV"},
-      {0x64766E31, "DVCPRO HD"},
-      {0x61766369, "AVC-Intra"},
-      {0x706E6720, "PNG"},
-      {0x4D504547, "MPEG 2"},
-      {0x44505820, "Cineon / DPX"},
-      {0x76323130, "Uncompressed YUV"},
-      {0x41414320, "AAC"},
-      {0x74776F73, "Uncompressed (PCM)"},
-      {0x6D703461, "MPEG Audio"},
-      {0x65632D33, "Dolby Digital Plus"},
-      {0x77617663, "WAVE compressed"},
-      {0x61707268, "ProRes RAW"},
+  // clang-format off
+  const std::pair<unsigned int, const char*> kCases[] = {
+      {0x61766331, "H.264"}, {0x48323634, "H.264"}, {0x63766131, "unknown"}, {0, "unknown"},
+      {0xFFFFFFFF, "unknown"}, {0x4156646E, "DNxHD"}, {0x68647631, "HDV"}, {0x68647639, "HDV"},
+      {0x68647630, "unknown"}, {0x68647661, "HDV"}, {0x68647662, "unknown"}, {0x78643561, "XDCAM HD"},
+      {0x78643566, "XDCAM HD"}, {0x78643567, "unknown"}, {0x78647639, "XDCAM HD"}, {0x78647661, "XDCAM HD"},
+      {0x78647662, "XDCAM EX"}, {0x78647666, "XDCAM EX"}, {0x78647667, "unknown"}, {0x30357664, "DV"},
+      {0x64766320, "DV"}, {0x64766E31, "DVCPRO HD"}, {0x61766369, "AVC-Intra"}, {0x706E6720, "PNG"},
+      {0x4D504547, "MPEG 2"}, {0x44505820, "Cineon / DPX"}, {0x76323130, "Uncompressed YUV"},
+      {0x41414320, "AAC"}, {0x74776F73, "Uncompressed (PCM)"}, {0x6D703461, "MPEG Audio"},
+      {0x65632D33, "Dolby Digital Plus"}, {0x77617663, "WAVE compressed"}, {0x61707268, "ProRes RAW"},
       {0x6170636E, "ProRes"},
+      {TranslateFourCC(0x63766131), "AVC-Intra"}, {TranslateFourCC(0x4D435054), "MPEG 2"},  // aliases
   };
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.code);
-    EXPECT_EQ(GetCodecFamilyName(c.code), c.family);
+  // clang-format on
+  for (const auto& [code, family] : kCases) {
+    SCOPED_TRACE(code);
+    EXPECT_EQ(GetCodecFamilyName(code), family);
   }
-  EXPECT_EQ(GetCodecFamilyName(TranslateFourCC(0x63766131)), "AVC-Intra");
-  EXPECT_EQ(GetCodecFamilyName(TranslateFourCC(0x4D435054)), "MPEG 2");
 }
 
 }  // namespace
