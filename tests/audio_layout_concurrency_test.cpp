@@ -11,19 +11,22 @@ namespace {
 
 constexpr std::size_t kThreads = 8;
 
+template <typename Body>
+void RunOnThreads(Body body) {
+  std::vector<std::thread> threads;
+  for (std::size_t t = 0; t < kThreads; ++t) threads.emplace_back(body, t);
+  for (std::thread& thread : threads) thread.join();
+}
+
 // The supported set is built on first use; threads racing to that first use
 // must all see the one complete set.
 TEST(GetSupportedAudioChannelDescriptions, FirstUseFromManyThreadsSeesOneCompleteSet) {
   std::array<const AudioChannelDescriptionSet*, kThreads> seen{};
   std::array<std::size_t, kThreads> sizes{};
-  std::vector<std::thread> threads;
-  for (std::size_t t = 0; t < kThreads; ++t) {
-    threads.emplace_back([&, t] {
-      seen[t] = &GetSupportedAudioChannelDescriptions();
-      sizes[t] = seen[t]->size();
-    });
-  }
-  for (std::thread& thread : threads) thread.join();
+  RunOnThreads([&](std::size_t t) {
+    seen[t] = &GetSupportedAudioChannelDescriptions();
+    sizes[t] = seen[t]->size();
+  });
   for (std::size_t t = 0; t < kThreads; ++t) {
     SCOPED_TRACE(t);
     EXPECT_EQ(seen[t], seen[0]);
@@ -37,15 +40,11 @@ TEST(ComputeChannelConversionMatrix, ThreadsSharingTheLayoutsGetTheSameMatrix) {
   ChannelConversionMatrix expected;
   ComputeChannelConversionMatrix(source, destination, expected);
   std::array<ChannelConversionMatrix, kThreads> results;
-  std::vector<std::thread> threads;
-  for (std::size_t t = 0; t < kThreads; ++t) {
-    threads.emplace_back([&, t] {
-      for (int round = 0; round < 200; ++round) {
-        ComputeChannelConversionMatrix(source, destination, results[t]);
-      }
-    });
-  }
-  for (std::thread& thread : threads) thread.join();
+  RunOnThreads([&](std::size_t t) {
+    for (int round = 0; round < 200; ++round) {
+      ComputeChannelConversionMatrix(source, destination, results[t]);
+    }
+  });
   for (const ChannelConversionMatrix& result : results) EXPECT_EQ(result, expected);
 }
 

@@ -41,12 +41,12 @@ inline AudioChannelLabel ParseLabel(std::string_view word) {
 }
 
 inline std::string LabelText(AudioChannelLabel label) {
+  const auto value = static_cast<std::uint32_t>(label);
   if (label == kUnknownLabel) return "?";
   for (std::size_t k = 0; k < std::size(kAbbreviations); ++k) {
-    if (static_cast<std::uint32_t>(label) == KnownLabelValue(k))
-      return std::string(kAbbreviations[k]);
+    if (value == KnownLabelValue(k)) return std::string(kAbbreviations[k]);
   }
-  return "#" + std::to_string(static_cast<std::uint32_t>(label));
+  return "#" + std::to_string(value);
 }
 
 // "L R C" -> {FrontLeft, FrontRight, FrontCenter}; "" -> empty.
@@ -59,8 +59,9 @@ inline AudioChannelLayout ParseLayout(std::string_view text) {
 
 inline std::string LayoutText(const AudioChannelLayout& layout) {
   std::string text;
-  for (AudioChannelDescription channel : layout)
+  for (AudioChannelDescription channel : layout) {
     text += (text.empty() ? "" : " ") + LabelText(channel.label);
+  }
   return text;
 }
 

@@ -41,16 +41,10 @@ bool IsSilent(const std::vector<double>& row) {
   return std::all_of(row.begin(), row.end(), [](double gain) { return gain == 0.0; });
 }
 
-struct MatrixCase {
-  const char* source;
-  const char* destination;
-  Rows rows;
-};
-
-void ExpectMatrices(const std::vector<MatrixCase>& cases) {
-  for (const MatrixCase& c : cases) {
-    SCOPED_TRACE(std::string(c.source) + " -> " + c.destination);
-    EXPECT_EQ(Compute(ParseLayout(c.source), ParseLayout(c.destination)), c.rows);
+void ExpectMatrices(const std::vector<std::tuple<const char*, const char*, Rows>>& cases) {
+  for (const auto& [source, destination, rows] : cases) {
+    SCOPED_TRACE(std::string(source) + " -> " + destination);
+    EXPECT_EQ(Compute(ParseLayout(source), ParseLayout(destination)), rows);
   }
 }
 
@@ -70,7 +64,6 @@ TEST(ComputeChannelConversionMatrix, GivesTheRoutingForCommonConversions) {
       {"*", "L R C LFE Ls Rs", {{1}, {1}, {1}, {1}, {1}, {1}}},
       {"* * * *", "L R C LFE Ls Rs", Identity(4, 6)},
       {"L R Ls Rs", "L R C", {{1, 0, 0, 0}, {0, 1, 0, 0}, {kHalf, kHalf, 0, 0}}},
-      {"L", "Lw", {{1}}},
       {"L R C LFE Ls Rs", "*", {{kSixth, kSixth, kSixth, kSixth, kSixth, kSixth}}},
       // An exact label beats a nearer-looking neighbour seen first.
       {"Lw L", "L", {{0, 1}}},
@@ -82,7 +75,6 @@ TEST(ComputeChannelConversionMatrix, GivesTheRoutingForCommonConversions) {
       // Heights are nearer to the top centre than listener-height speakers.
       {"Vhl Vhr L R", "Ts", {{kHalf, kHalf, 0, 0}}},
       {"L R C", "Y", {{0, 0, 1}}},
-      {"L R Cs", "Ts", {{0, 0, 1}}},
       {"Lsd Rsd C", "Ts", {{kThird, kThird, kThird}}},
       // Discrete destination channels match Discrete sources by ordinal.
       {"L * * R", "* C *", {{0, 1, 0, 0}, {kHalf, 0, 0, kHalf}, {0, 0, 1, 0}}},
@@ -90,7 +82,6 @@ TEST(ComputeChannelConversionMatrix, GivesTheRoutingForCommonConversions) {
       {"* *", "L R C", Identity(2, 3)},
       {"", "L R", Identity(0, 2)},
       {"L R", "", {}},
-      {"", "", {}},
       {"", "*", {{}}},
       // An unknown value is no low-frequency channel: it is a speaker at the
       // centre, as near to Lc as to Rc and nearer than to L.
@@ -105,10 +96,8 @@ TEST(ComputeChannelConversionMatrix, LabelledMonoSourceFeedsEveryDiscreteDestina
   // clang-format off
   ExpectMatrices({
       {"C", "* *", {{1}, {1}}},
-      {"L", "* * * *", {{1}, {1}, {1}, {1}}},
       {"LFE", "* *", {{1}, {1}}},
       {"C", "* L", {{1}, {1}}},
-      {"C", "*", {{1}}},
   });
   // clang-format on
 }
@@ -162,12 +151,12 @@ bool IsLowFrequency(AudioChannelLabel label) {
 
 // Outside the identity fallback (both sides multichannel, one side unlabelled):
 // a labelled destination channel whose label the source carries takes exactly
-// the first such source channel at 1.0; a speaker destination channel (neither
-// Discrete nor low-frequency) is never silent when the source has a speaker;
-// and a low-frequency channel is fed from nothing but its own label (a mono
-// source feeds everything).
+// the first such source channel at 1.0; no row is silent when either side is
+// mono, nor a speaker row (neither Discrete nor low-frequency) when the source
+// has a speaker; and a low-frequency channel is fed only from its own label
+// (or from a mono source).
 TEST(ComputeChannelConversionMatrix,
-     EveryPairOfNamedLayoutsTakesSharedLabelsAndLeavesNoSpeakerSilent) {
+     EveryPairOfNamedLayoutsTakesSharedLabelsAndLeavesNoRoutableRowSilent) {
   ForEachPairOfNamedLayouts(
       [](const AudioChannelLayout& source, const AudioChannelLayout& destination) {
         if (source.size() != 1 && destination.size() != 1 &&
@@ -188,7 +177,9 @@ TEST(ComputeChannelConversionMatrix,
             expected[static_cast<std::size_t>(first - source.begin())] = 1.0;
             EXPECT_EQ(rows[j], expected);
           }
-          EXPECT_FALSE(isSpeaker(label) && sourceHasSpeaker && IsSilent(rows[j]));
+          const bool routable = (isSpeaker(label) && sourceHasSpeaker) || source.size() == 1 ||
+                                destination.size() == 1;
+          EXPECT_FALSE(routable && IsSilent(rows[j]));
           if (!IsLowFrequency(label) || source.size() == 1) continue;
           for (std::size_t i = 0; i < source.size(); ++i) {
             EXPECT_TRUE(rows[j][i] == 0.0 || source[i].label == label) << "source channel " << i;
@@ -197,27 +188,22 @@ TEST(ComputeChannelConversionMatrix,
       });
 }
 
-TEST(ComputeChannelConversionMatrix, NoRowIsSilentBetweenMonoAndAnyNamedLayout) {
-  const AudioChannelLayout mono = CreateMonoChannelLayout();
-  for (const testing::NamedLayout& named : testing::kNamedLayouts) {
-    SCOPED_TRACE(named.name);
-    for (const auto& row : Compute(mono, named.create())) EXPECT_FALSE(IsSilent(row));
-    for (const auto& row : Compute(named.create(), mono)) EXPECT_FALSE(IsSilent(row));
-  }
-}
-
-TEST(ComputeChannelConversionMatrix, ReplacesWhateverTheResultHeld) {
+TEST(ChannelConversionMatrix, BothBuildersReplaceWhateverTheResultHeld) {
   const AudioChannelLayout source = Create51ChannelLayout();
   const AudioChannelLayout destination = CreateStereoChannelLayout();
   const Rows expected = Compute(source, destination);
   for (std::size_t rows : {2, 5}) {
-    ChannelConversionMatrix matrix(rows, ChannelConversionMatrixRow(rows == 2 ? 6 : 1, 7.0));
+    SCOPED_TRACE(rows);
+    ChannelConversionMatrix matrix(rows, ChannelConversionMatrixRow(7 - rows, 9.0));
     ComputeChannelConversionMatrix(source, destination, matrix);
     EXPECT_EQ(ToRows(matrix), expected);
+    CreateIdentityChannelConversionMatrix(2, 3, matrix);
+    EXPECT_EQ(ToRows(matrix), (Rows{{1, 0}, {0, 1}, {0, 0}}));
+    CreateIdentityChannelConversionMatrix(3, 2, matrix);
+    EXPECT_EQ(ToRows(matrix), (Rows{{1, 0, 0}, {0, 1, 0}}));
+    CreateIdentityChannelConversionMatrix(0, 2, matrix);
+    EXPECT_EQ(ToRows(matrix), (Rows{{}, {}}));
   }
-  ChannelConversionMatrix identity(2, ChannelConversionMatrixRow(2, 7.0));
-  ComputeChannelConversionMatrix(ParseLayout("* *"), ParseLayout("* *"), identity);
-  EXPECT_EQ(ToRows(identity), Identity(2, 2));
 }
 
 TEST(ComputeChannelConversionMatrix, LargeLayoutsGiveFullSizeMatrices) {
@@ -230,23 +216,6 @@ TEST(ComputeChannelConversionMatrix, LargeLayoutsGiveFullSizeMatrices) {
   ExpectWellFormed(labelled, CreateStereoChannelLayout(), matrix);
   EXPECT_EQ(matrix[0][1], 1.0);
   EXPECT_EQ(matrix[1][1], 1.0);
-}
-
-TEST(CreateIdentityChannelConversionMatrix, PutsOnesOnTheLeadingDiagonal) {
-  // clang-format off
-  const std::tuple<std::size_t, std::size_t, Rows> kCases[] = {
-      {2, 3, {{1, 0}, {0, 1}, {0, 0}}},
-      {3, 2, {{1, 0, 0}, {0, 1, 0}}},
-      {2, 0, {}},
-      {0, 2, {{}, {}}},
-  };
-  // clang-format on
-  for (const auto& [sources, destinations, rows] : kCases) {
-    SCOPED_TRACE(std::to_string(sources) + " x " + std::to_string(destinations));
-    ChannelConversionMatrix matrix(4, ChannelConversionMatrixRow(4, 9.0));
-    CreateIdentityChannelConversionMatrix(sources, destinations, matrix);
-    EXPECT_EQ(ToRows(matrix), rows);
-  }
 }
 
 TEST(ComputeChannelConversionMatrix, RandomLayoutsGiveWellFormedMatricesExhaustive) {
