@@ -103,10 +103,8 @@ TEST(CreateMultichannelLayoutWithDefaultLabels, HugeCountIsReportedAndClampedNot
 }
 
 TEST(GetChannelCount, SumsTheLayoutsOfAList) {
-  AudioChannelLayoutList list;
-  EXPECT_EQ(GetChannelCount(list), 0u);
-  list = {CreateStereoChannelLayout(), Create51ChannelLayout(), AudioChannelLayout()};
-  EXPECT_EQ(GetChannelCount(list), 8u);
+  EXPECT_EQ(GetChannelCount({}), 0u);
+  EXPECT_EQ(GetChannelCount({CreateStereoChannelLayout(), Create51ChannelLayout(), {}}), 8u);
 }
 
 TEST(AudioChannelLayoutQuery, AnswersForEachLayout) {

@@ -192,7 +192,7 @@ TEST(ChannelConversionMatrix, BothBuildersReplaceWhateverTheResultHeld) {
   const AudioChannelLayout source = Create51ChannelLayout();
   const AudioChannelLayout destination = CreateStereoChannelLayout();
   const Rows expected = Compute(source, destination);
-  for (std::size_t rows : {2, 5}) {
+  for (std::size_t rows : {std::size_t{2}, std::size_t{5}}) {
     SCOPED_TRACE(rows);
     ChannelConversionMatrix matrix(rows, ChannelConversionMatrixRow(7 - rows, 9.0));
     ComputeChannelConversionMatrix(source, destination, matrix);
