@@ -2,31 +2,35 @@
 #include <zebmediatypes/audio_channel_layout.h>
 #include <zebmediatypes/channel_conversion_matrix.h>
 
+#include <array>
 #include <thread>
 #include <vector>
 
 namespace zebmediatypes {
 namespace {
 
+constexpr std::size_t kThreads = 8;
+
+template <typename Body>
+void RunOnThreads(Body body) {
+  std::vector<std::thread> threads;
+  for (std::size_t t = 0; t < kThreads; ++t) threads.emplace_back(body, t);
+  for (std::thread& thread : threads) thread.join();
+}
+
 // The supported set is built on first use; threads racing to that first use
 // must all see the one complete set.
 TEST(GetSupportedAudioChannelDescriptions, FirstUseFromManyThreadsSeesOneCompleteSet) {
-  constexpr int kThreads = 8;
-  std::vector<const AudioChannelDescriptionSet*> seen(kThreads, nullptr);
-  std::vector<std::size_t> sizes(kThreads, 0);
-  std::vector<std::thread> threads;
-  for (int t = 0; t < kThreads; ++t) {
-    threads.emplace_back([&, t] {
-      const AudioChannelDescriptionSet& supported = GetSupportedAudioChannelDescriptions();
-      seen[static_cast<std::size_t>(t)] = &supported;
-      sizes[static_cast<std::size_t>(t)] = supported.size();
-    });
-  }
-  for (std::thread& thread : threads) thread.join();
-  for (int t = 0; t < kThreads; ++t) {
+  std::array<const AudioChannelDescriptionSet*, kThreads> seen{};
+  std::array<std::size_t, kThreads> sizes{};
+  RunOnThreads([&](std::size_t t) {
+    seen[t] = &GetSupportedAudioChannelDescriptions();
+    sizes[t] = seen[t]->size();
+  });
+  for (std::size_t t = 0; t < kThreads; ++t) {
     SCOPED_TRACE(t);
-    EXPECT_EQ(seen[static_cast<std::size_t>(t)], seen[0]);
-    EXPECT_EQ(sizes[static_cast<std::size_t>(t)], kAudioChannelLabelCount);
+    EXPECT_EQ(seen[t], seen[0]);
+    EXPECT_EQ(sizes[t], kAudioChannelLabelCount);
   }
 }
 
@@ -35,17 +39,12 @@ TEST(ComputeChannelConversionMatrix, ThreadsSharingTheLayoutsGetTheSameMatrix) {
   const AudioChannelLayout destination = CreateStereoChannelLayout();
   ChannelConversionMatrix expected;
   ComputeChannelConversionMatrix(source, destination, expected);
-  constexpr int kThreads = 4;
-  std::vector<ChannelConversionMatrix> results(kThreads);
-  std::vector<std::thread> threads;
-  for (int t = 0; t < kThreads; ++t) {
-    threads.emplace_back([&, t] {
-      for (int round = 0; round < 200; ++round) {
-        ComputeChannelConversionMatrix(source, destination, results[static_cast<std::size_t>(t)]);
-      }
-    });
-  }
-  for (std::thread& thread : threads) thread.join();
+  std::array<ChannelConversionMatrix, kThreads> results;
+  RunOnThreads([&](std::size_t t) {
+    for (int round = 0; round < 200; ++round) {
+      ComputeChannelConversionMatrix(source, destination, results[t]);
+    }
+  });
   for (const ChannelConversionMatrix& result : results) EXPECT_EQ(result, expected);
 }
 
