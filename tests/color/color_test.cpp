@@ -308,11 +308,10 @@ TEST(ColorSpace, IntegerWiderThanThirtyTwoBitsFailsTheRead) {
 
 TEST(ColorManagementSettings, BooleanGivenAsAnyIntegerCounts) {
   const ScopedStart started;
-  const std::pair<const char*, bool> kCases[] = {{"1", true},
-                                                 {"0", false},
-                                                 {"-7", true},
-                                                 {"4294967296", true},
-                                                 {"18446744073709551615", true}};
+  // clang-format off
+  const std::pair<const char*, bool> kCases[] = {
+      {"1", true}, {"0", false}, {"-7", true}, {"4294967296", true}, {"18446744073709551615", true}};
+  // clang-format on
   for (const auto& [value, expected] : kCases) {
     SCOPED_TRACE(value);
     EXPECT_EQ(ReadSettings(std::string(R"({"autoToneMapEnabled":)") + value + "}"),
