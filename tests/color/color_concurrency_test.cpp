@@ -7,6 +7,7 @@
 #include <chrono>
 #include <string>
 #include <thread>
+#include <utility>
 #include <vector>
 
 #include "color/color_test_support.h"
@@ -15,26 +16,26 @@ namespace zebmediatypes {
 namespace {
 
 using color::ColorSpace;
-using testing::MakeSpace;
+using testing::DefaultSpace;
 
 constexpr int kThreads = 8;
-constexpr auto kDuration = std::chrono::seconds(3);
 
 TEST(ColorCaches, EightThreadsLoseNoEntryAndAgreeOnTexts) {
   Initialize();  // keeps the library started whatever the workers do
   std::atomic<int> failures{0};
   std::atomic<long> rounds{0};
-  const auto deadline = std::chrono::steady_clock::now() + kDuration;
+  const auto deadline = std::chrono::steady_clock::now() + std::chrono::seconds(3);
   std::vector<std::thread> workers;
   for (int t = 0; t < kThreads; ++t) {
     workers.emplace_back([t, deadline, &failures, &rounds] {
       std::vector<std::pair<zebcore::utility::Guid, ColorSpace>> mine;
-      for (int i = 0; std::chrono::steady_clock::now() < deadline; ++i) {
+      for (int i = 0; std::chrono::steady_clock::now() < deadline; ++i, ++rounds) {
         // A balanced start and stop around each round: the cache is never
         // emptied under a round, because the test's own start outlives them.
         Initialize();
-        ColorSpace space = MakeSpace("thread " + std::to_string(t) + " space " + std::to_string(i),
-                                     static_cast<std::uint32_t>(i % 5), (i & 1) != 0);
+        const ColorSpace space =
+            testing::MakeSpace("thread " + std::to_string(t) + " space " + std::to_string(i),
+                               static_cast<std::uint32_t>(i % 5), (i & 1) != 0);
         const auto id = color::AddColorSpaceToCache(space);
         mine.emplace_back(id, space);
         // Every entry this thread ever added is still there.
@@ -50,10 +51,9 @@ TEST(ColorCaches, EightThreadsLoseNoEntryAndAgreeOnTexts) {
         const auto cached = textCache.FindValue(text);
         if (!cached || *cached != space) ++failures;
         // Setting the same default again takes the colour lock twice over.
-        if (i % 64 == 0) color::SetDefaultColorSpace(testing::DefaultSpace());
-        if (color::GetDefaultColorSpace() != testing::DefaultSpace()) ++failures;
+        if (i % 64 == 0) color::SetDefaultColorSpace(DefaultSpace());
+        if (color::GetDefaultColorSpace() != DefaultSpace()) ++failures;
         Terminate();
-        ++rounds;
       }
     });
   }

@@ -2,22 +2,21 @@
 #pragma once
 
 #include <zebcore/allocator.h>
-#include <zebcore/guid.h>
 #include <zebcore/logging.h>
 #include <zebcore/string.h>
 #include <zebmediatypes/color/color_management_settings.h>
 #include <zebmediatypes/color/color_space.h>
 
 #include <boost/make_shared.hpp>
-#include <boost/shared_ptr.hpp>
 #include <cstring>
-#include <initializer_list>
-#include <memory>
-#include <mutex>
+#include <future>
 #include <ostream>
 #include <string>
 #include <string_view>
+#include <thread>
 #include <vector>
+
+#include "color/color_state.h"
 
 namespace zebmediatypes::color {
 
@@ -34,17 +33,6 @@ inline void PrintTo(const ColorManagementSettings& settings, std::ostream* out) 
 namespace zebmediatypes::testing {
 
 inline zebcore::UTF8String U8(std::string_view text) { return zebcore::string::ToUTF8String(text); }
-inline std::string Narrow(const zebcore::UTF8String& text) {
-  return zebcore::string::ToStdString(text);
-}
-
-inline std::shared_ptr<zebcore::allocator::RecycledMemory> Block(
-    const std::vector<unsigned char>& bytes) {
-  auto block = zebcore::allocator::RecycledMemory::Create(0);
-  unsigned char* data = block->Allocate(bytes.size());
-  if (!bytes.empty()) std::memcpy(data, bytes.data(), bytes.size());
-  return block;
-}
 
 inline color::ColorSpace MakeSpace(std::string_view name, std::uint32_t type = 0,
                                    bool linearized = false) {
@@ -57,36 +45,44 @@ inline color::ColorSpace MakeSpace(std::string_view name, std::uint32_t type = 0
 
 inline color::ColorSpace DefaultSpace() { return MakeSpace("BT.709 RGB Full", 1); }
 
-// Records usage events while installed.
-class RecordingUsageLogger final : public zebcore::config::UsageLogger {
- public:
-  void LogEvent(std::string_view area, std::string_view category, std::string_view event) override {
-    std::lock_guard<std::mutex> lock(mutex_);
-    events_.push_back(std::string(area) + "/" + std::string(category) + "/" + std::string(event));
-  }
-  std::vector<std::string> Events() const {
-    std::lock_guard<std::mutex> lock(mutex_);
-    return events_;
-  }
+// Records the usage events logged on this thread while it lives.
+class ScopedUsageLogger {
+  struct Recorder final : zebcore::config::UsageLogger {
+    void LogEvent(std::string_view area, std::string_view category,
+                  std::string_view event) override {
+      events.push_back(std::string(area) + "/" + std::string(category) + "/" + std::string(event));
+    }
+    std::vector<std::string> events;
+  };
+  boost::shared_ptr<Recorder> recorder_ = boost::make_shared<Recorder>();
+  boost::shared_ptr<zebcore::config::UsageLogger> previous_ =
+      zebcore::config::UsageLogger::Set(recorder_);
 
- private:
-  mutable std::mutex mutex_;
-  std::vector<std::string> events_;
+ public:
+  ~ScopedUsageLogger() { zebcore::config::UsageLogger::Set(previous_); }
+  const std::vector<std::string>& Events() const { return recorder_->events; }
 };
 
-class ScopedUsageLogger {
- public:
-  ScopedUsageLogger() : logger_(boost::make_shared<RecordingUsageLogger>()) {
-    previous_ = zebcore::config::UsageLogger::Set(logger_);
-  }
-  ~ScopedUsageLogger() { zebcore::config::UsageLogger::Set(previous_); }
-  ScopedUsageLogger(const ScopedUsageLogger&) = delete;
-  ScopedUsageLogger& operator=(const ScopedUsageLogger&) = delete;
-  std::vector<std::string> Events() const { return logger_->Events(); }
+// Holds the colour lock from another thread while it lives, with the wait
+// limit cut to 20 ms so that every other taker times out quickly.
+class ColorLockHolder {
+  unsigned int previousWait_ = details::SetLockWaitMilliseconds(20);
+  std::promise<void> held_, release_;
+  std::future<void> heldFuture_ = held_.get_future(), released_ = release_.get_future();
+  std::thread thread_{[this] {
+    const bool locked = details::ColorLock().Lock(nullptr, 5000);
+    held_.set_value();
+    released_.wait();
+    if (locked) details::ColorLock().Unlock();
+  }};
 
- private:
-  boost::shared_ptr<RecordingUsageLogger> logger_;
-  boost::shared_ptr<zebcore::config::UsageLogger> previous_;
+ public:
+  ColorLockHolder() { heldFuture_.wait(); }
+  ~ColorLockHolder() {
+    release_.set_value();
+    thread_.join();
+    details::SetLockWaitMilliseconds(previousWait_);
+  }
 };
 
 }  // namespace zebmediatypes::testing

@@ -7,22 +7,21 @@
 #include <zebmediatypes/color/color_serialization.h>
 #include <zebmediatypes/initialization.h>
 
-#include <condition_variable>
-#include <mutex>
-#include <thread>
-
-#include "color/color_state.h"
 #include "color/color_test_support.h"
 
 namespace zebmediatypes {
 namespace {
 
 using color::ColorSpace;
+using color::GetDefaultColorSpace;
 using testing::DefaultSpace;
 using testing::MakeSpace;
 
-bool CommandPresent() {
-  return zebcore::console::CommandRegistry::Get().HasCommand(u"zebmediatypes.TimeToTimecode");
+bool CommandsPresent() {
+  const auto& registry = zebcore::console::CommandRegistry::Get();
+  const bool time = registry.HasCommand(u"zebmediatypes.TimeToTimecode");
+  EXPECT_EQ(registry.HasCommand(u"zebmediatypes.TimecodeToTime"), time);
+  return time;
 }
 
 // Whether the library is stopped: a Terminate is then refused and reported.
@@ -36,48 +35,39 @@ bool IsStopped() {
 
 TEST(Lifecycle, DefaultColorSpaceIsInstalledAndHiddenAfterTheLastTerminate) {
   ASSERT_TRUE(IsStopped());
-  EXPECT_EQ(color::GetDefaultColorSpace(), ColorSpace());
-  Initialize();
-  const ColorSpace installed = color::GetDefaultColorSpace();
-  EXPECT_EQ(installed, DefaultSpace());
-  EXPECT_EQ(color::RetrieveColorSpaceFromCache(DefaultSpace().ToGuid()), DefaultSpace());
-  Terminate();
-  EXPECT_EQ(color::GetDefaultColorSpace(), ColorSpace());
-  EXPECT_EQ(color::RetrieveColorSpaceFromCache(DefaultSpace().ToGuid()), ColorSpace());
+  for (int round = 0; round < 2; ++round) {
+    EXPECT_EQ(GetDefaultColorSpace(), ColorSpace());
+    Initialize();
+    EXPECT_EQ(GetDefaultColorSpace(), DefaultSpace());
+    EXPECT_EQ(color::RetrieveColorSpaceFromCache(DefaultSpace().ToGuid()), DefaultSpace());
+    Terminate();
+    EXPECT_EQ(color::RetrieveColorSpaceFromCache(DefaultSpace().ToGuid()), ColorSpace());
+  }
   // The kept default shows again as soon as the cache holds anything.
   color::AddColorSpaceToCache(MakeSpace("after-stop"));
-  EXPECT_EQ(color::GetDefaultColorSpace(), DefaultSpace());
+  EXPECT_EQ(GetDefaultColorSpace(), DefaultSpace());
   Initialize();
   Terminate();
-  EXPECT_EQ(color::GetDefaultColorSpace(), ColorSpace());
+  EXPECT_EQ(GetDefaultColorSpace(), ColorSpace());
 }
 
-TEST(Lifecycle, NestedStartsKeepTheCacheUntilTheLastTerminate) {
-  ASSERT_TRUE(IsStopped());
-  Initialize();
-  Initialize();
-  const ColorSpace entry = MakeSpace("nested", 2);
-  const auto id = color::AddColorSpaceToCache(entry);
-  Terminate();
-  EXPECT_EQ(color::RetrieveColorSpaceFromCache(id), entry);
-  EXPECT_EQ(color::GetDefaultColorSpace(), DefaultSpace());
-  Terminate();
-  EXPECT_EQ(color::RetrieveColorSpaceFromCache(id), ColorSpace());
-  EXPECT_TRUE(IsStopped());
-}
-
-TEST(Lifecycle, LaterInitializeKeepsTheCallersDefault) {
+TEST(Lifecycle, NestedStartsKeepTheCacheAndTheCallersDefaultUntilTheLastTerminate) {
   ASSERT_TRUE(IsStopped());
   Initialize();
   const ColorSpace mine = MakeSpace("Display P3", 2, true);
   color::SetDefaultColorSpace(mine);
   Initialize();
-  EXPECT_EQ(color::GetDefaultColorSpace(), mine);
+  const auto id = color::AddColorSpaceToCache(MakeSpace("nested", 2));
+  EXPECT_EQ(GetDefaultColorSpace(), mine);
   Terminate();
+  EXPECT_EQ(color::RetrieveColorSpaceFromCache(id), MakeSpace("nested", 2));
+  EXPECT_EQ(GetDefaultColorSpace(), mine);
   Terminate();
+  EXPECT_EQ(color::RetrieveColorSpaceFromCache(id), ColorSpace());
+  EXPECT_TRUE(IsStopped());
   // A first start installs the library's default anew.
   Initialize();
-  EXPECT_EQ(color::GetDefaultColorSpace(), DefaultSpace());
+  EXPECT_EQ(GetDefaultColorSpace(), DefaultSpace());
   Terminate();
 }
 
@@ -89,73 +79,37 @@ TEST(Lifecycle, UnbalancedTerminateIsReportedAndDoesNotWrap) {
   EXPECT_EQ(capture.Count(), 2u);
   // The count stayed at 0: one start and one stop bring the library up and down.
   Initialize();
-  EXPECT_EQ(color::GetDefaultColorSpace(), DefaultSpace());
+  EXPECT_EQ(GetDefaultColorSpace(), DefaultSpace());
   Terminate();
-  EXPECT_EQ(color::GetDefaultColorSpace(), ColorSpace());
+  EXPECT_EQ(GetDefaultColorSpace(), ColorSpace());
   EXPECT_EQ(capture.Count(), 2u);
 }
 
 TEST(Lifecycle, CommandsArePresentOnlyWhileStarted) {
   ASSERT_TRUE(IsStopped());
-  EXPECT_FALSE(CommandPresent());
+  EXPECT_FALSE(CommandsPresent());
   ASSERT_TRUE(zebcore::config::StartUp());
-  const bool present = CommandPresent();
-  EXPECT_EQ(color::GetDefaultColorSpace(), DefaultSpace());
+  const bool present = CommandsPresent();
+  EXPECT_EQ(GetDefaultColorSpace(), DefaultSpace());
   zebcore::config::ShutDown();
-  EXPECT_FALSE(CommandPresent());
+  EXPECT_FALSE(CommandsPresent());
   EXPECT_TRUE(IsStopped());
   if (!present) GTEST_SKIP() << "the time console commands are not built into this library";
 }
 
-// Holds the colour lock from another thread while it lives.
-class ColorLockHolder {
- public:
-  ColorLockHolder() : thread_([this] { Run(); }) {
-    std::unique_lock<std::mutex> guard(mutex_);
-    changed_.wait(guard, [this] { return held_; });
-  }
-  ~ColorLockHolder() {
-    {
-      std::lock_guard<std::mutex> guard(mutex_);
-      release_ = true;
-    }
-    changed_.notify_all();
-    thread_.join();
-  }
-  ColorLockHolder(const ColorLockHolder&) = delete;
-  ColorLockHolder& operator=(const ColorLockHolder&) = delete;
-
- private:
-  void Run() {
-    const bool locked = details::ColorLock().Lock(nullptr, 5000);
-    std::unique_lock<std::mutex> guard(mutex_);
-    held_ = true;
-    changed_.notify_all();
-    changed_.wait(guard, [this] { return release_; });
-    if (locked) details::ColorLock().Unlock();
-  }
-  std::mutex mutex_;
-  std::condition_variable changed_;
-  bool held_ = false;
-  bool release_ = false;
-  std::thread thread_;
-};
-
 TEST(Lifecycle, FailedStartLeavesTheCountAndRegistersNothing) {
   ASSERT_TRUE(IsStopped());
-  const unsigned int previousWait = details::SetLockWaitMilliseconds(20);
   {
     zebcore::debug::ScopedAssertionCapture capture;
-    const ColorLockHolder holder;
+    const testing::ColorLockHolder holder;
     Initialize();  // cannot install the default colour space
     EXPECT_FALSE(zebcore::config::StartUp());
-    EXPECT_FALSE(CommandPresent());
+    EXPECT_FALSE(CommandsPresent());
     EXPECT_GE(capture.Count(), 2u);
   }
-  details::SetLockWaitMilliseconds(previousWait);
   zebcore::config::ShutDown();
   EXPECT_TRUE(IsStopped());
-  EXPECT_EQ(color::GetDefaultColorSpace(), ColorSpace());
+  EXPECT_EQ(GetDefaultColorSpace(), ColorSpace());
 }
 
 }  // namespace
