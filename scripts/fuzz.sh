@@ -2,7 +2,7 @@
 # Runs every fuzz target of a fuzz build for ZMT_FUZZ_SECONDS seconds each
 # (default 20), starting from its seed corpus. A crash, a sanitizer report or a
 # leak fails the run. For a longer session:
-#   ZMT_FUZZ_SECONDS=3600 bash scripts/fuzz.sh build/fuzz
+#   ZMT_FUZZ_SECONDS=3600 bash scripts/fuzz.sh build/asan
 set -euo pipefail
 build=${1:?usage: fuzz.sh <fuzz build folder>}
 seconds=${ZMT_FUZZ_SECONDS:-20}
