@@ -26,7 +26,7 @@ void RunThreads(int count, const std::function<void()>& body) {
   for (auto& t : threads) t.join();
 }
 
-TEST(RecursiveMutex, LockTimesOutWhileAnotherThreadHoldsIt) {
+TEST(RecursiveMutex, LockTimesOutAndUnlockIsRefusedWhileAnotherThreadHoldsIt) {
   RecursiveMutex mutex("held");
   std::atomic<bool> held{false}, release{false};
   std::thread holder([&] {
@@ -43,25 +43,19 @@ TEST(RecursiveMutex, LockTimesOutWhileAnotherThreadHoldsIt) {
   EXPECT_FALSE(mutex.Lock("waiter", 20));
   EXPECT_FALSE(RecursiveLockGuard(mutex, "guard", 0));
   zebcore::logging::SetTraceSink({}, 0);
-  ASSERT_EQ(traced.size(), 2u);
-  EXPECT_NE(traced[0].find("waiter"), std::string::npos);
-  EXPECT_NE(traced[0].find("held"), std::string::npos);
-
+  ASSERT_EQ(traced.size(), 2u);  // the timeout names the waiter and the mutex
+  EXPECT_TRUE(traced[0].find("waiter") != std::string::npos &&
+              traced[0].find("held") != std::string::npos)
+      << traced[0];
+  {
+    zebcore::debug::ScopedAssertionCapture capture;
+    mutex.Unlock();  // not the holder: reported, still held
+    EXPECT_EQ(capture.Count(), 1u);
+    EXPECT_FALSE(mutex.Lock("intruder", 10));
+  }
   release = true;
   holder.join();
   EXPECT_TRUE(mutex.Lock("after", 1000));  // free again
-  mutex.Unlock();
-}
-
-TEST(RecursiveMutex, AnotherThreadCannotUnlockIt) {
-  RecursiveMutex mutex("owned");
-  ASSERT_TRUE(mutex.Lock("owner", 0));
-  zebcore::debug::ScopedAssertionCapture capture;
-  RunThreads(1, [&] {
-    mutex.Unlock();
-    EXPECT_FALSE(mutex.Lock("intruder", 10));  // still held by the owner
-  });
-  EXPECT_EQ(capture.Count(), 1u);
   mutex.Unlock();
 }
 
@@ -81,9 +75,7 @@ TEST(RecursiveMutex, SerializesHolders) {
 TEST(ScopedAssertionCapture, CapturesReportsFromOtherThreads) {
   zebcore::debug::ScopedAssertionCapture capture;
   RunThreads(4, [] {
-    for (int i = 0; i < 100; ++i) {
-      zebcore::debug::ReportAssertion("x", "from a thread", __FILE__, "worker", __LINE__);
-    }
+    for (int i = 0; i < 100; ++i) zebcore::debug::ReportAssertion("x", "from a thread", "", "", 1);
   });
   EXPECT_EQ(capture.Count(), 400u);
   EXPECT_EQ(capture.LastMessage(), "from a thread");
@@ -102,9 +94,7 @@ TEST(CommandRegistry, StaysConsistentUnderConcurrentUse) {
       // Every thread races for the same few names.
       const UTF16String name =
           u"zebcore.race." + UTF16String(1, static_cast<char16_t>(u'a' + i % 5));
-      if (registry.RegisterCommand(name, u"", [] { return std::make_shared<Nop>(); })) {
-        ++registered;
-      }
+      registered += registry.RegisterCommand(name, u"", [] { return std::make_shared<Nop>(); });
       zebcore::string::oUTF16StringStream out;
       registry.Execute(name, u"", out);
       if (registry.UnregisterCommand(name)) --registered;
@@ -112,9 +102,8 @@ TEST(CommandRegistry, StaysConsistentUnderConcurrentUse) {
     }
   });
   EXPECT_EQ(registered.load(), 0);
-  for (const auto& entry : registry.Commands()) {
+  for (const auto& entry : registry.Commands())
     EXPECT_NE(entry.name.rfind(u"zebcore.race.", 0), 0u);
-  }
 }
 
 TEST(Localizer, ReadsWhileTranslationsChange) {

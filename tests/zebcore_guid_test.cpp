@@ -6,7 +6,6 @@
 #include <algorithm>
 #include <cstdint>
 #include <random>
-#include <set>
 #include <string>
 #include <vector>
 
@@ -46,13 +45,9 @@ Guid ReferenceMurmur3(const unsigned char* data, std::size_t len) {
   const std::size_t tail = len - blocks;
   if (tail > 8) h2 ^= rotl(load(blocks + 8, tail - 8) * c2, 33) * c1;
   if (tail > 0) h1 ^= rotl(load(blocks, std::min<std::size_t>(tail, 8)) * c1, 31) * c2;
-  h1 ^= len;
-  h2 ^= len;
-  h1 += h2;
-  h2 += h1;
-  h1 = fmix(h1);
-  h2 = fmix(h2);
-  h1 += h2;
+  h1 = (h1 ^ len) + (h2 ^ len);
+  h2 = fmix((h2 ^ len) + h1);
+  h1 = fmix(h1) + h2;
   h2 += h1;
   Guid::Bytes bytes;
   for (std::size_t b = 0; b < 8; ++b) {
@@ -101,23 +96,15 @@ TEST(Murmur3, StreamingMatchesTheOneShotAlgorithm) {
   }
 }
 
-TEST(Murmur3, DistinctInputsGiveDistinctGuids) {
-  std::set<Guid> seen;
-  for (int i = 0; i < 10000; ++i) seen.insert(HashOf(std::to_string(i)));
-  EXPECT_EQ(seen.size(), 10000u);
-  EXPECT_EQ(seen.count(Guid()), 0u);
-}
-
 TEST(Guid, TextAndOrderFollowTheUnsignedBytesFirstToLast) {
   constexpr Guid kNull;
   Guid::Bytes counting, low{}, highBit{};
   for (std::size_t i = 0; i < 16; ++i) counting[i] = static_cast<unsigned char>(i * 17);
   low[15] = 0xFF;
   highBit[0] = 0x80;  // above 0x7F: compared unsigned
-  EXPECT_TRUE(kNull.IsNull());
-  EXPECT_FALSE(Guid(low).IsNull());
-  EXPECT_EQ(kNull.ToString(), "00000000-0000-0000-0000-000000000000");
-  EXPECT_EQ(Guid(counting).ToString(), "00112233-4455-6677-8899-aabbccddeeff");
+  EXPECT_TRUE(kNull.IsNull() && !Guid(low).IsNull());
+  EXPECT_EQ(kNull.ToString() + " " + Guid(counting).ToString(),
+            "00000000-0000-0000-0000-000000000000 00112233-4455-6677-8899-aabbccddeeff");
   const Guid ordered[] = {kNull, Guid(low), Guid(counting), Guid(highBit)};
   for (std::size_t i = 1; i < std::size(ordered); ++i) {
     SCOPED_TRACE(i);

@@ -17,7 +17,6 @@
 
 #include <climits>
 #include <cmath>
-#include <cstring>
 #include <random>
 #include <sstream>
 #include <string>
@@ -44,19 +43,15 @@ TEST_F(LocalizerTest, GivesTheTranslationOrTheDefault) {
       {"$$$/zebmediatypes/RenderQuality/Draft=Draft", u"Brouillon"},
       {"$$$/zebmediatypes/RenderQuality/High=High", u"High"},      // no translation
       {"$$$/zebmediatypes/RenderQuality/Draft", u""},              // no '='
-      {"$$$/a/b=x=y", u"x=y"},                                     // the first '=' splits
-      {"$$$/a/b=", u""},
-      {"$$$/a/b=\xC3\xA9t\xC3\xA9 @0", u"\u00E9t\u00E9 @0"},       // UTF-8 default
       {"$$$/zebmediatypes/RenderQuality/Draft =Draft", u"Draft"},  // paths match exactly
+      {"$$$/a/b=x=y", u"x=y"}, {"$$$/a/b=", u""},                  // the first '=' splits
+      {"$$$/a/b=\xC3\xA9t\xC3\xA9 @0", u"\u00E9t\u00E9 @0"},       // UTF-8 default
   };
   // clang-format on
   for (const Case& c : kCases) {
     SCOPED_TRACE(c.key);
     EXPECT_EQ(localizer.Localize(c.key), UTF16String(c.text));
   }
-  localizer.ClearTranslations();
-  EXPECT_EQ(localizer.Localize("$$$/zebmediatypes/RenderQuality/Draft=Draft"),
-            UTF16String(u"Draft"));
 }
 
 TEST_F(LocalizerTest, ThrowErrorCarriesTheLocalizedText) {
@@ -82,13 +77,12 @@ TEST(Assertion, CaptureSeesEveryFieldAndANestedCaptureRestoresTheOuterOne) {
   zd::ReportAssertion("b != 0", "Attempt to divide by zero", "tick_time.cpp",
                       "zebmediatypes::TickTime::operator /", 42);
   ASSERT_EQ(capture.Count(), 1u);
-  const auto report = capture.Reports().front();
-  EXPECT_EQ(report.at(zd::kDebugExpression), "b != 0");
-  EXPECT_EQ(report.at(zd::kDebugMessage), "Attempt to divide by zero");
-  EXPECT_EQ(report.at(zd::kDebugSource), "tick_time.cpp");
-  EXPECT_EQ(report.at(zd::kDebugFunction), "zebmediatypes::TickTime::operator /");
-  EXPECT_EQ(report.at(zd::kDebugLine), "42");
-  EXPECT_EQ(capture.LastMessage(), "Attempt to divide by zero");
+  EXPECT_EQ(capture.Reports().front(),
+            (zd::DebugDictionary{{zd::kDebugExpression, "b != 0"},
+                                 {zd::kDebugMessage, "Attempt to divide by zero"},
+                                 {zd::kDebugSource, "tick_time.cpp"},
+                                 {zd::kDebugFunction, "zebmediatypes::TickTime::operator /"},
+                                 {zd::kDebugLine, "42"}}));
   {
     zd::ScopedAssertionCapture inner;
     zd::ReportAssertion(nullptr, nullptr, nullptr, nullptr, 0);  // null texts are empty
@@ -98,8 +92,6 @@ TEST(Assertion, CaptureSeesEveryFieldAndANestedCaptureRestoresTheOuterOne) {
   zd::ReportAssertion("x", "outer", "", "", 2);
   EXPECT_EQ(capture.Count(), 2u);
   EXPECT_EQ(capture.LastMessage(), "outer");
-  capture.Clear();
-  EXPECT_EQ(capture.Count(), 0u);
 }
 
 TEST(Assertion, WithoutAHookReportsOneLineToStandardError) {
@@ -122,11 +114,11 @@ TEST(Logging, RecordsReachTheSinkAndTheStructuredTrace) {
       },
       4);
   EXPECT_TRUE(zl::LoggingIsEnabled());
-  EXPECT_FALSE(zl::TraceEnabled("any", 5));
-  zl::LogRecord record;
-  record.message = "Opened";
-  record.fields = {
-      {"frames", std::int64_t{25}}, {"name", zs::ToUTF8String("clip \"1\"")}, {"drop", true}};
+  const zl::LogRecord record{
+      "Opened",
+      {{"frames", std::int64_t{25}}, {"name", zs::ToUTF8String("clip \"1\"")}, {"drop", true}},
+      "",
+      ""};
   zl::Log(record);
   zl::LogException("Reader", std::runtime_error("bad file"));
   zl::Trace("x", 5, "too detailed");  // above the level: dropped
@@ -135,8 +127,8 @@ TEST(Logging, RecordsReachTheSinkAndTheStructuredTrace) {
   EXPECT_FALSE(zl::LoggingIsEnabled());
   zl::Log(record);  // dropped, no crash
   ASSERT_EQ(logged.size(), 2u);
-  EXPECT_EQ(logged[0].message, "Opened");
-  EXPECT_EQ(logged[1].source + ": " + logged[1].message, "Reader: bad file");
+  EXPECT_EQ(logged[0].message + "|" + logged[1].source + ": " + logged[1].message,
+            "Opened|Reader: bad file");
   ASSERT_EQ(traced.size(), 2u);
   EXPECT_EQ(traced[0],
             "zebcore.StructuredLogging/4/Opened, frames: 25, name: \"clip \\\"1\\\"\", drop: "
@@ -177,8 +169,7 @@ TEST(CommandRegistry, RegistersRunsAndUnregisters) {
   EXPECT_FALSE(registry.RegisterCommand(
       u"zebcore.test.None", u"", [] { return std::shared_ptr<zebcore::console::Command>(); }));
   EXPECT_FALSE(registry.RegisterCommand(u"zebcore.test.Empty", u"", {}));
-  EXPECT_FALSE(registry.HasCommand(u"zebcore.test.None"));
-  EXPECT_TRUE(registry.HasCommand(name));
+  EXPECT_TRUE(registry.HasCommand(name) && !registry.HasCommand(u"zebcore.test.None"));
 
   std::ostringstream narrow;
   zebcore::console::ConsoleOutputStream out(narrow);
@@ -186,11 +177,8 @@ TEST(CommandRegistry, RegistersRunsAndUnregisters) {
   EXPECT_EQ(narrow.str(), "echo \xC3\xA9\xF0\x9F\x8E\xAC 3\n");
   EXPECT_FALSE(registry.Execute(u"zebcore.test.Missing", u"", out));
 
-  auto command = registry.UnregisterCommand(name);
-  EXPECT_TRUE(command);
-  EXPECT_EQ(command.use_count(), 1);  // the registry let go of it
-  EXPECT_FALSE(registry.HasCommand(name));
-  EXPECT_FALSE(registry.UnregisterCommand(name));
+  EXPECT_EQ(registry.UnregisterCommand(name).use_count(), 1);  // the registry let go of it
+  EXPECT_FALSE(registry.HasCommand(name) || registry.UnregisterCommand(name));
 }
 
 Strings& Calls() {
@@ -208,18 +196,20 @@ void Term() {
   Calls().push_back(std::string("term ") + kName);
 }
 using Registrar = zebcore::config::InitializerRegistrar;
+using zebcore::config::kInitializerContext_Core;
+using zebcore::config::kMaxInitializerDependencies;
+using Dependencies = zebcore::config::InitializerDependency[kMaxInitializerDependencies];
+const Dependencies kNone = {};
 
 TEST(StartUp, InitializesInOrderAndShutDownReverses) {
   using namespace zebcore::config;
   Calls().clear();
-  const InitializerDependency none[kMaxInitializerDependencies] = {};
-  InitializerDependency needsA[kMaxInitializerDependencies] = {};
-  needsA[0].name = "zebcore.test.A";
+  const Dependencies needsA = {{"zebcore.test.A"}};
   {
     // C waits for A although it registered first; B comes after A.
     Registrar c("zebcore.test.C", kInitializerContext_Core, Init<'C'>, Term<'C'>, nullptr, needsA);
-    Registrar a("zebcore.test.A", kInitializerContext_Core, Init<'A'>, Term<'A'>, nullptr, none);
-    Registrar b("zebcore.test.B", kInitializerContext_Media, Init<'B'>, Term<'B'>, nullptr, none);
+    Registrar a("zebcore.test.A", kInitializerContext_Core, Init<'A'>, Term<'A'>, nullptr, kNone);
+    Registrar b("zebcore.test.B", kInitializerContext_Media, Init<'B'>, Term<'B'>, nullptr, kNone);
     StartUp();
     StartUp();  // nothing left to start
     ShutDown();
@@ -232,11 +222,9 @@ TEST(StartUp, AFailedInitializerIsRetriedAndOnlyAStartedOneTerminates) {
   using namespace zebcore::config;
   Calls().clear();
   gFlakyAttempts = 0;
-  const InitializerDependency none[kMaxInitializerDependencies] = {};
-  InitializerDependency needsF[kMaxInitializerDependencies] = {};
-  needsF[3].name = "zebcore.test.F";
+  const Dependencies needsF = {{}, {}, {}, {"zebcore.test.F"}};  // any slot counts
   {
-    Registrar f("zebcore.test.F", kInitializerContext_Core, Init<'F'>, Term<'F'>, nullptr, none);
+    Registrar f("zebcore.test.F", kInitializerContext_Core, Init<'F'>, Term<'F'>, nullptr, kNone);
     Registrar a("zebcore.test.A", kInitializerContext_Core, Init<'A'>, Term<'A'>, nullptr, needsF);
     EXPECT_FALSE(StartUp());
     ShutDown();
@@ -251,23 +239,16 @@ TEST(RationalApproximation, FindsTheIntendedFraction) {
   // clang-format off
   struct Case { double value; int numerator; int denominator; };
   const Case kCases[] = {
-      {29.97002997, 30000, 1001},
-      {25.0, 25, 1},
-      {-0.75, -3, 4},
-      {0.0, 0, 1},
+      {29.97002997, 30000, 1001}, {25.0, 25, 1}, {-0.75, -3, 4}, {0.0, 0, 1}, {1e-12, 0, 1},
       {M_PI, 208341, 66317},  // the first convergent within 1e-10
-      {1e-12, 0, 1},
-      {2147483646.0, 2147483646, 1},
-      {4e9, INT_MAX, 1},
-      {-HUGE_VAL, -INT_MAX, 1},
+      {2147483646.0, 2147483646, 1}, {4e9, INT_MAX, 1}, {-HUGE_VAL, -INT_MAX, 1},
       {std::nan(""), 0, 1},
   };
   // clang-format on
   for (const Case& c : kCases) {
     SCOPED_TRACE(c.value);
-    const boost::rational<int> r = zebcore::utility::RationalApproximation(c.value);
-    EXPECT_EQ(r.numerator(), c.numerator);
-    EXPECT_EQ(r.denominator(), c.denominator);
+    EXPECT_EQ(zebcore::utility::RationalApproximation(c.value),
+              boost::rational<int>(c.numerator, c.denominator));
   }
   std::mt19937_64 random(5);
   std::uniform_real_distribution<double> uniform(-1e6, 1e6);
@@ -305,15 +286,12 @@ TEST(Base64, RejectsBadTextAndKeepsTheGroupsBeforeIt) {
   // clang-format off
   struct Case { const char* text; std::size_t bytesKept; };
   const Case kCases[] = {
-      {"Zm9", 0},        // bad length
-      {"Zm9vY", 3},
-      {"Zm9v!mFy", 3},   // outside the alphabet
-      {"Zm9v Zm9v", 3},  // white space is not allowed
-      {"Zg==Zm9v", 0},   // padding before the end
-      {"Z===", 0},
-      {"Zg=v", 0},       // a data character after padding
-      {"Zm9vZ-==", 3},   // the URL-safe alphabet is not this one
-      {"\xC3\xA9\xC3\xA9", 0},
+      {"Zm9", 0}, {"Zm9vY", 3},             // bad length
+      {"Zm9v!mFy", 3}, {"\xC3\xA9\xC3\xA9", 0},  // outside the alphabet
+      {"Zm9v Zm9v", 3},                     // white space is not allowed
+      {"Zg==Zm9v", 0}, {"Z===", 0},         // padding before the end
+      {"Zg=v", 0},                          // a data character after padding
+      {"Zm9vZ-==", 3},                      // the URL-safe alphabet is not this one
   };
   // clang-format on
   for (const Case& c : kCases) {
@@ -329,13 +307,12 @@ TEST(RecycledMemory, SharesZeroedBytes) {
   EXPECT_EQ(block->GetData(), nullptr);
   unsigned char* data = block->Allocate(16);
   ASSERT_NE(data, nullptr);
-  EXPECT_EQ(std::vector<unsigned char>(data, data + block->GetSize()),
-            std::vector<unsigned char>(16));
   data[0] = 7;
   auto shared = block;
-  block->Allocate(32);
-  EXPECT_EQ(shared->GetData()[0], 7);   // kept
-  EXPECT_EQ(shared->GetData()[31], 0);  // new bytes are zero
+  data = block->Allocate(32);
+  std::vector<unsigned char> expected(32);
+  expected[0] = 7;  // kept; new bytes are zero
+  EXPECT_EQ(std::vector<unsigned char>(data, data + shared->GetSize()), expected);
   EXPECT_EQ(block->Allocate(0), nullptr);
 }
 
@@ -349,8 +326,6 @@ TEST(CachedSerializer, MapsBothWaysAndReplacesEitherSide) {
   EXPECT_FALSE(cache.FindValue(u8("one")));
   EXPECT_EQ(cache.FindText(1), u8("uno"));
   EXPECT_EQ(cache.Size(), 2u);
-  cache.Clear();
-  EXPECT_FALSE(cache.FindText(2));
 }
 
 }  // namespace
