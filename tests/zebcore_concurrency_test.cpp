@@ -8,7 +8,6 @@
 #include <zebcore/mutex.h>
 
 #include <atomic>
-#include <chrono>
 #include <functional>
 #include <string>
 #include <thread>
@@ -28,35 +27,28 @@ void RunThreads(int count, const std::function<void()>& body) {
 
 TEST(RecursiveMutex, LockTimesOutAndUnlockIsRefusedWhileAnotherThreadHoldsIt) {
   RecursiveMutex mutex("held");
-  std::atomic<bool> held{false}, release{false};
-  std::thread holder([&] {
-    ASSERT_TRUE(mutex.Lock("holder", 1000));
-    held = true;
-    while (!release) std::this_thread::sleep_for(std::chrono::milliseconds(1));
-    mutex.Unlock();
-  });
-  while (!held) std::this_thread::sleep_for(std::chrono::milliseconds(1));
-
+  ASSERT_TRUE(mutex.Lock("holder", 0));
   std::vector<std::string> traced;
   zebcore::logging::SetTraceSink(
       [&](std::string_view, int, std::string_view text) { traced.emplace_back(text); }, 1);
-  EXPECT_FALSE(mutex.Lock("waiter", 20));
-  EXPECT_FALSE(RecursiveLockGuard(mutex, "guard", 0));
+  zebcore::debug::ScopedAssertionCapture capture;
+  RunThreads(1, [&] {
+    EXPECT_FALSE(mutex.Lock("waiter", 20));
+    EXPECT_FALSE(RecursiveLockGuard(mutex, "guard", 0));
+    mutex.Unlock();  // not the holder: reported, still held
+    EXPECT_FALSE(mutex.Lock("intruder", 10));
+  });
   zebcore::logging::SetTraceSink({}, 0);
-  ASSERT_EQ(traced.size(), 2u);  // the timeout names the waiter and the mutex
+  EXPECT_EQ(capture.Count(), 1u);
+  ASSERT_EQ(traced.size(), 3u);  // each timeout names the waiter and the mutex
   EXPECT_TRUE(traced[0].find("waiter") != std::string::npos &&
               traced[0].find("held") != std::string::npos)
       << traced[0];
-  {
-    zebcore::debug::ScopedAssertionCapture capture;
-    mutex.Unlock();  // not the holder: reported, still held
-    EXPECT_EQ(capture.Count(), 1u);
-    EXPECT_FALSE(mutex.Lock("intruder", 10));
-  }
-  release = true;
-  holder.join();
-  EXPECT_TRUE(mutex.Lock("after", 1000));  // free again
   mutex.Unlock();
+  RunThreads(1, [&] {
+    EXPECT_TRUE(mutex.Lock("after", 1000));  // free again
+    mutex.Unlock();
+  });
 }
 
 TEST(RecursiveMutex, SerializesHolders) {

@@ -40,8 +40,7 @@ TEST(JSONParse, GivesEachValueItsTypeAndKeepsIntegersExact) {
       {"{\"a\":1,\"a\":2}", typeid(JSONObject), "{\"a\":2}"},  // a repeated key: the last
       {"null", typeid(void), "null"},  // a document that is JSON null is not a failure
       {"-0", typeid(std::int64_t), "0"}, {"-9223372036854775808", typeid(std::int64_t), nullptr},
-      {"9223372036854775807", typeid(std::int64_t), nullptr},
-      {"9223372036854775808", typeid(std::uint64_t), nullptr},
+      {"9223372036854775807", typeid(std::int64_t), nullptr}, {"9223372036854775808", typeid(std::uint64_t), nullptr},
       {"18446744073709551615", typeid(std::uint64_t), nullptr},
       {"1e2", typeid(double), "100.0"}, {"-0.0", typeid(double), "-0.0"},
       {"1e-400", typeid(double), "0.0"},  // tiny numbers underflow towards zero
