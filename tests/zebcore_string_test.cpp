@@ -26,13 +26,15 @@ TEST(UTF8to16, DecodesValidTextAndReplacesEachIllFormedSubsequenceOnce) {
       {"\xF0\x9F\x8E\xAC\xF4\x8F\xBF\xBF", u"\U0001F3AC\U0010FFFF"},  // four, up to the last scalar
       {std::string("a\0b", 3), std::u16string(u"a\0b", 3)},         // zero is an ordinary character
       {"\x80", u"\uFFFD"}, {"\xBF\x80", u"\uFFFD\uFFFD"},            // lone continuation bytes
-      {"\xC0\xAF", u"\uFFFD\uFFFD"}, {"\xC1\xBF", u"\uFFFD\uFFFD"},  // overlong: C0, C1 start nothing
+      // Overlong forms: C0 and C1 start nothing.
+      {"\xC0\xAF", u"\uFFFD\uFFFD"}, {"\xC1\xBF", u"\uFFFD\uFFFD"},
       {"\xE0\x80\xAF", u"\uFFFD\uFFFD\uFFFD"}, {"\xF0\x80\x80\xAF", u"\uFFFD\uFFFD\uFFFD\uFFFD"},
-      {"\xED\xA0\x80", u"\uFFFD\uFFFD\uFFFD"},                      // an encoded surrogate
-      {"\xF4\x90\x80\x80", u"\uFFFD\uFFFD\uFFFD\uFFFD"},            // above U+10FFFF
+      // An encoded surrogate, above U+10FFFF, bytes that start nothing.
+      {"\xED\xA0\x80", u"\uFFFD\uFFFD\uFFFD"}, {"\xF4\x90\x80\x80", u"\uFFFD\uFFFD\uFFFD\uFFFD"},
       {"\xF5\x80", u"\uFFFD\uFFFD"}, {"\xFF", u"\uFFFD"},
       {"\xC3", u"\uFFFD"}, {"\xE2\x82", u"\uFFFD"}, {"\xF0\x9F\x8E", u"\uFFFD"},  // truncated
-      {"\xE2\x82" "A", u"\uFFFDA"}, {"\xF0\x9F" "\xC3\xA9", u"\uFFFD\u00E9"},  // the breaker is read again
+      // The byte that breaks a sequence is read again.
+      {"\xE2\x82" "A", u"\uFFFDA"}, {"\xF0\x9F" "\xC3\xA9", u"\uFFFD\u00E9"},
   };
   // clang-format on
   for (const Case& c : kCases) {
@@ -111,19 +113,18 @@ TEST(NumberToString, RoundsPadsTrimsAndFitsTheLength) {
                 const char* text; };
   const Case kCases[] = {
       {29.97002997, 1, 2, kTrim, 31, "29.97"}, {102, 1, 2, 0, 31, "102.00"},
-      {100.0, 1, 2, kTrim, 31, "100"},                       // trailing integer zeros stay
+      {100.0, 1, 2, kTrim, 31, "100"}, {1.25, 1, -3, 0, 31, "1"},  // integer zeros stay; -3 is 0
       {0.5, 1, 0, 0, 31, "1"}, {-0.5, 1, 0, 0, 31, "-1"},    // an exact half rounds away from zero
       {9.995, 1, 2, 0, 31, "9.99"},                          // stored just below the half
       {99.95, 1, 1, 0, 31, "100.0"},                         // just above; the carry adds a digit
       {-0.0, 1, 2, 0, 31, "0.00"}, {-0.001, 1, 2, 0, 31, "0.00"},  // rounds to zero: no sign
       {-1.5, 3, 1, 0, 31, "-001.5"}, {1.5, 1, 1, kPlus, 31, "+1.5"}, {0.0, 1, 1, kPlus, 31, "0.0"},
-      {1.25, 1, -3, 0, 31, "1"},                             // fraction digits below 0 mean 0
-      {0.1, 1, 40, 0, 31, "0.10000000000000001"},            // and above 17 as 17
+      {0.1, 1, 40, 0, 31, "0.10000000000000001"},            // fraction digits above 17 mean 17
       {1e31, 1, 0, 0, 31, "9999999999999999635896294965248"},  // 31 digits still fit
       {1e40, 1, 0, kTrim, 31, "1e+40"}, {-DBL_MAX, 1, 17, kTrim, 31, "-1.7976931348623157e+308"},
       {123456789.0, 1, 2, 0, 8, "1.23e+08"}, {DBL_MAX, 1, 2, 0, 7, "2e+308"},
-      {DBL_MAX, 1, 2, 0, 0, "2e+308"},                       // nothing fits: the shortest form
-      {std::nan(""), 1, 2, 0, 31, "nan"}, {HUGE_VAL, 1, 2, kPlus, 31, "+inf"}, {-HUGE_VAL, 1, 2, 0, 31, "-inf"},
+      {DBL_MAX, 1, 2, 0, 0, "2e+308"}, {std::nan(""), 1, 2, 0, 31, "nan"},  // 0: the shortest form
+      {HUGE_VAL, 1, 2, kPlus, 31, "+inf"}, {-HUGE_VAL, 1, 2, 0, 31, "-inf"},
   };
   // clang-format on
   for (const Case& c : kCases) {
@@ -185,8 +186,7 @@ TEST(ReplaceInString, FillsNumberedSlotsOnce) {
   // clang-format off
   struct Case { const char16_t* text; const char16_t* expected; };
   const Case kCases[] = {
-      {u"@1/@0 fps", u"B/A fps"}, {u"@0@0@9.", u"AAJ."}, {u"", u""},
-      {u"@3", u""},                           // an empty replacement
+      {u"@1/@0 fps", u"B/A fps"}, {u"@0@0@9.", u"AAJ."}, {u"", u""}, {u"@3", u""},
       {u"50@", u"50@"}, {u"a@b", u"a@b"},     // '@' at the end or before a letter stays
       {u"@@0", u"@0"}, {u"@@@0", u"@A"},      // "@@" is a literal '@'
   };
@@ -224,18 +224,15 @@ TEST(UTF16OStream, FormatsLikeTheDefaultNarrowStreamAndFlushesOnEndl) {
   EXPECT_EQ(out.flushes, 2);
 }
 
-TEST(iUTF16StringStream, ReadsTokensAndNumbers) {
-  iUTF16StringStream in(u"  hello 29.97\t-12  +5 ");
+TEST(iUTF16StringStream, ReadsTokensAndNumbersAndAFailedReadLeavesTheTargetAndStops) {
+  iUTF16StringStream good(u"  hello 29.97\t-12  +5 ");
   UTF16String word;
   double fps = 0;
   std::int64_t a = 0, b = 0;
-  EXPECT_TRUE(in >> word >> fps >> a >> b);
+  EXPECT_TRUE(good >> word >> fps >> a >> b);
   oUTF16StringStream out;
-  out << word << '|' << fps << '|' << a << '|' << b << '|' << in.rest();
+  out << word << '|' << fps << '|' << a << '|' << b << '|' << good.rest();
   EXPECT_EQ(Narrow(out.str()), "hello|29.97|-12|5| ");
-}
-
-TEST(iUTF16StringStream, AFailedReadLeavesTheTargetAndFailsLaterReads) {
   const char16_t* const kCases[] = {u"abc 5", u"1.5 5", u"9223372036854775808 5",
                                     u"+-1 5", u"",      u"12x 5"};
   for (const char16_t* text : kCases) {
