@@ -24,24 +24,28 @@ std::string Print(const boost::any& value, bool pretty = false) {
   return zebcore::string::ToStdString(GetJSONUTF8String(value, pretty));
 }
 
+// The text read and written again; "(unreadable)" when it does not read.
+std::string Reprint(const std::string& text, bool pretty = false) {
+  const JSONValue value = Parse(text);
+  return value ? Print(*value, pretty) : "(unreadable)";
+}
+
 UTF8String U8(const char* s) { return zebcore::string::ToUTF8String(s); }
 
 TEST(JSONParse, GivesEachValueItsTypeAndKeepsIntegersExact) {
   // clang-format off
+  // A null `printed` means the text prints as it reads.
   struct Case { const char* text; const std::type_info& type; const char* printed; };
   const Case kCases[] = {
-      {"{}", typeid(JSONObject), "{}"},
-      {"{\"a\":1,\"a\":2}", typeid(JSONObject), "{\"a\":2}"},  // a repeated key: the last
-      {"null", typeid(void), "null"},  // a document that is JSON null is not a failure
-      {"-0", typeid(std::int64_t), "0"},
-      {"9223372036854775807", typeid(std::int64_t), "9223372036854775807"},
-      {"-9223372036854775808", typeid(std::int64_t), "-9223372036854775808"},
-      {"9223372036854775808", typeid(std::uint64_t), "9223372036854775808"},
-      {"18446744073709551615", typeid(std::uint64_t), "18446744073709551615"},
-      {"1e2", typeid(double), "100.0"},
-      {"-0.0", typeid(double), "-0.0"},
-      {"1e-400", typeid(double), "0.0"},  // tiny numbers underflow towards zero
-      {"true", typeid(bool), "true"},
+      // A document that is JSON null is not a failure; of a repeated key the last counts.
+      {"{}", typeid(JSONObject), nullptr}, {"null", typeid(void), nullptr},
+      {"true", typeid(bool), nullptr}, {"{\"a\":1,\"a\":2}", typeid(JSONObject), "{\"a\":2}"},
+      {"-0", typeid(std::int64_t), "0"}, {"9223372036854775807", typeid(std::int64_t), nullptr},
+      {"-9223372036854775808", typeid(std::int64_t), nullptr},
+      {"9223372036854775808", typeid(std::uint64_t), nullptr},
+      {"18446744073709551615", typeid(std::uint64_t), nullptr}, {"1e2", typeid(double), "100.0"},
+      // Tiny numbers underflow towards zero.
+      {"-0.0", typeid(double), "-0.0"}, {"1e-400", typeid(double), "0.0"},
       {" \t\r\n \"text\" \n", typeid(UTF8String), "\"text\""},
   };
   // clang-format on
@@ -50,7 +54,7 @@ TEST(JSONParse, GivesEachValueItsTypeAndKeepsIntegersExact) {
     const JSONValue value = Parse(c.text);
     ASSERT_TRUE(value);
     EXPECT_EQ(value->type(), c.type);
-    EXPECT_EQ(Print(*value), c.printed);
+    EXPECT_EQ(Print(*value), c.printed ? c.printed : c.text);
   }
 }
 
@@ -76,29 +80,21 @@ TEST(JSONParse, RejectsMalformedTextAndNumbersOutsideTheirRanges) {
     EXPECT_FALSE(Parse(text));
   }
   EXPECT_FALSE(JSONParse(nullptr, 10));
-  EXPECT_TRUE(Parse(std::string("{\"a\":1}\0", 8)));
   EXPECT_TRUE(Parse(std::string("[2]\0garbage", 11)));
 }
 
 TEST(JSONParse, LimitsNesting) {
   for (const char* open : {"[", "{\"k\":"}) {
-    const char* close = open[0] == '[' ? "]" : "}";
     auto nested = [&](std::size_t depth) {
       std::string text;
       for (std::size_t i = 0; i < depth; ++i) text += open;
-      text += "1";
-      for (std::size_t i = 0; i < depth; ++i) text += close;
-      return text;
+      return text + "1" + std::string(depth, open[0] == '[' ? ']' : '}');
     };
     SCOPED_TRACE(open);
-    const JSONValue deepest = Parse(nested(kMaxJSONDepth));
-    ASSERT_TRUE(deepest);
-    {
-      // The deepest readable document prints whole and reads back.
-      zebcore::debug::ScopedAssertionCapture capture;
-      EXPECT_EQ(Print(*deepest), nested(kMaxJSONDepth));
-      EXPECT_EQ(capture.Count(), 0u);
-    }
+    // The deepest readable document prints whole, without a report.
+    zebcore::debug::ScopedAssertionCapture capture;
+    EXPECT_EQ(Reprint(nested(kMaxJSONDepth)), nested(kMaxJSONDepth));
+    EXPECT_EQ(capture.Count(), 0u);
     EXPECT_FALSE(Parse(nested(kMaxJSONDepth + 1)));
     EXPECT_FALSE(Parse(nested(100000)));
     EXPECT_FALSE(Parse(std::string(1000000, open[0])));  // never closed
@@ -119,26 +115,15 @@ TEST(JSONParse, RejectsEveryTruncation) {
 }
 
 TEST(GetJSONUTF8String, WritesMembersInKeyOrderCompactOrIndented) {
-  boost::any object;
-  AddToObject(object, "zebra", std::int64_t{-5}, false);
-  AddToObject(object, "alpha", true, false);
-  AddToObject(object, "mid", U8("q\"\\/\b\f\n\r\t\x01\x1F\xC3\xA9"), false);
-  AddToObject(object, "num", 0.1, false);
-  AddToObject(object, "whole", 25.0, false);
-  AddToObject(object, "big", std::numeric_limits<std::uint64_t>::max(), false);
-  AddToObject(object, "none", boost::any(), false);
-  boost::any array = JSONArray{std::make_shared<boost::any>(std::int64_t{1}),
-                               std::make_shared<boost::any>(JSONObject()),
-                               std::make_shared<boost::any>(JSONArray())};
-  AddToObject(object, "list", array, false);
-  EXPECT_EQ(Print(object),
+  // Escapes are read in any form and written in the shortest one.
+  EXPECT_EQ(Reprint("{\"zebra\":-5,\"alpha\":true,\"mid\":\"q\\u0022\\\\\\/\\u0008\\u000c\\u000A"
+                    "\\u000d\\u0009\\u0001\\u001F\\u00e9\",\"num\":0.1,\"whole\":25.0,"
+                    "\"big\":18446744073709551615,\"none\":null,\"list\":[1,{},[]]}"),
             "{\"alpha\":true,\"big\":18446744073709551615,\"list\":[1,{},[]],"
             "\"mid\":\"q\\\"\\\\/\\b\\f\\n\\r\\t\\u0001\\u001f\xC3\xA9\",\"none\":null,"
             "\"num\":0.1,\"whole\":25.0,\"zebra\":-5}");
-  boost::any pretty;
-  AddToObject(pretty, "a", std::int64_t{1}, false);
-  AddToObject(pretty, "b", JSONArray{std::make_shared<boost::any>(true)}, false);
-  EXPECT_EQ(Print(pretty, true), "{\n  \"a\": 1,\n  \"b\": [\n    true\n  ]\n}");
+  EXPECT_EQ(Reprint("{\"b\":[true],\"a\":1}", true),
+            "{\n  \"a\": 1,\n  \"b\": [\n    true\n  ]\n}");
 }
 
 TEST(GetJSONUTF8String, WritesValidTextForAnyValue) {
@@ -147,12 +132,8 @@ TEST(GetJSONUTF8String, WritesValidTextForAnyValue) {
   const Case kCases[] = {
       {std::numeric_limits<double>::quiet_NaN(), "null"},  // JSON has no NaN
       {U8("bad \xFF\xC3 utf8"), "\"bad \xEF\xBF\xBD\xEF\xBF\xBD utf8\""},
-      {std::string("narrow"), "\"narrow\""},
-      {42, "42"},
-      {1.5f, "1.5"},
-      {1e300, "1e+300"},
-      {JSONValue(), "null"},
-      {std::make_shared<boost::any>(std::int64_t{3}), "3"},
+      {std::string("narrow"), "\"narrow\""}, {42, "42"}, {1.5f, "1.5"}, {1e300, "1e+300"},
+      {JSONValue(), "null"}, {std::make_shared<boost::any>(std::int64_t{3}), "3"},
       {std::vector<int>{1}, "null"},  // not a JSON type
   };
   // clang-format on
@@ -167,9 +148,8 @@ TEST(GetJSONUTF8String, AValueThatContainsItselfPrintsAndReports) {
   auto self = std::make_shared<boost::any>(JSONArray());
   boost::any_cast<JSONArray>(self.get())->push_back(self);
   zebcore::debug::ScopedAssertionCapture capture;
-  const std::string text = Print(*self);
+  EXPECT_TRUE(Parse(Print(*self)));
   EXPECT_EQ(capture.Count(), 1u);
-  EXPECT_TRUE(Parse(text));
   boost::any_cast<JSONArray>(self.get())->clear();  // break the cycle
 }
 
@@ -182,13 +162,9 @@ TEST(GetJSONUTF8String, PrintedTextParsesToTheSameText) {
   };
   for (const char* text : kCases) {
     SCOPED_TRACE(text);
-    const JSONValue first = Parse(text);
-    ASSERT_TRUE(first);
-    for (bool pretty : {false, true}) {
-      const JSONValue again = Parse(Print(*first, pretty));
-      ASSERT_TRUE(again);
-      EXPECT_EQ(Print(*again), Print(*first));
-    }
+    const std::string once = Reprint(text);
+    EXPECT_EQ(Reprint(once), once);
+    EXPECT_EQ(Reprint(Reprint(text, true)), once);
   }
 }
 
@@ -200,12 +176,10 @@ TEST(GetJSONUTF8String, DoublesRoundTripBitForBit) {
     std::memcpy(&value, &bits, sizeof value);
     if (!std::isfinite(value)) continue;
     const std::string text = Print(value);
-    SCOPED_TRACE(text);
     const JSONValue back = Parse(text);
-    ASSERT_TRUE(back);
-    ASSERT_EQ(back->type(), typeid(double));
+    ASSERT_TRUE(back && back->type() == typeid(double)) << text;
     const double parsed = boost::any_cast<double>(*back);
-    EXPECT_EQ(std::memcmp(&parsed, &value, sizeof value), 0);
+    EXPECT_EQ(std::memcmp(&parsed, &value, sizeof value), 0) << text;
   }
 }
 
@@ -216,8 +190,7 @@ TEST(AddToObject, ReplacesOnlyWhenAskedAndRefusesANonObject) {
   EXPECT_EQ(Print(object), "{\"k\":1}");
   EXPECT_TRUE(AddToObject(object, U8("k"), std::int64_t{3}, true));
   EXPECT_EQ(Print(*GetVariantInObject(object, "k")), "3");
-  EXPECT_TRUE(ObjectHasProperty(object, "k"));
-  EXPECT_FALSE(ObjectHasProperty(object, "K"));
+  EXPECT_TRUE(ObjectHasProperty(object, "k") && !ObjectHasProperty(object, "K"));
   EXPECT_FALSE(GetVariantInObject(object, "missing"));
 
   boost::any number = std::int64_t{5};
@@ -225,20 +198,15 @@ TEST(AddToObject, ReplacesOnlyWhenAskedAndRefusesANonObject) {
   EXPECT_FALSE(AddToObject(number, "k", true, false));
   EXPECT_EQ(capture.Count(), 1u);
   EXPECT_EQ(boost::any_cast<std::int64_t>(number), 5);
-  EXPECT_FALSE(ObjectHasProperty(number, "k"));
-  EXPECT_FALSE(GetVariantInObject(number, "k"));
+  EXPECT_FALSE(ObjectHasProperty(number, "k") || GetVariantInObject(number, "k"));
 }
 
 TEST(GetJSONInt64, ReadsOnlyIntegersThatFit) {
   // clang-format off
   struct Case { boost::any value; bool ok; std::int64_t expected; };
   const Case kCases[] = {
-      {std::int64_t{-7}, true, -7},
-      {std::uint64_t{9223372036854775807ULL}, true, std::numeric_limits<std::int64_t>::max()},
-      {std::uint64_t{9223372036854775808ULL}, false, 0},
-      {1.0, false, 0},
-      {U8("1"), false, 0},
-      {boost::any(), false, 0},
+      {std::int64_t{-7}, true, -7}, {1.0, false, 0}, {U8("1"), false, 0}, {boost::any(), false, 0},
+      {(std::uint64_t{1} << 63) - 1, true, INT64_MAX}, {std::uint64_t{1} << 63, false, 0},
   };
   // clang-format on
   for (std::size_t i = 0; i < std::size(kCases); ++i) {

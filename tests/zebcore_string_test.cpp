@@ -6,10 +6,9 @@
 
 #include <cfloat>
 #include <cmath>
-#include <cstring>
-#include <memory>
 #include <random>
 #include <string>
+#include <vector>
 
 namespace {
 
@@ -23,35 +22,28 @@ TEST(UTF8to16, DecodesValidTextAndReplacesEachIllFormedSubsequenceOnce) {
   // clang-format off
   struct Case { std::string utf8; std::u16string utf16; };
   const Case kCases[] = {
-      {"", u""},
-      {"A\xC3\xA9\xE2\x82\xAC", u"A\u00E9\u20AC"},                 // one, two and three bytes
+      {"", u""}, {"A\xC3\xA9\xE2\x82\xAC", u"A\u00E9\u20AC"},      // one, two and three bytes
       {"\xF0\x9F\x8E\xAC\xF4\x8F\xBF\xBF", u"\U0001F3AC\U0010FFFF"},  // four, up to the last scalar
       {std::string("a\0b", 3), std::u16string(u"a\0b", 3)},         // zero is an ordinary character
-      {"\x80", u"\uFFFD"},                                          // a lone continuation byte
-      {"\xBF\x80", u"\uFFFD\uFFFD"},
-      {"\xC0\xAF", u"\uFFFD\uFFFD"},                                // overlong: C0 starts nothing
-      {"\xC1\xBF", u"\uFFFD\uFFFD"},
-      {"\xE0\x80\xAF", u"\uFFFD\uFFFD\uFFFD"},                      // overlong three-byte
-      {"\xF0\x80\x80\xAF", u"\uFFFD\uFFFD\uFFFD\uFFFD"},
-      {"\xED\xA0\x80", u"\uFFFD\uFFFD\uFFFD"},                      // an encoded surrogate
-      {"\xF4\x90\x80\x80", u"\uFFFD\uFFFD\uFFFD\uFFFD"},            // above U+10FFFF
-      {"\xF5\x80", u"\uFFFD\uFFFD"},
-      {"\xFF", u"\uFFFD"},
-      {"\xC3", u"\uFFFD"},                                          // truncated at the end
-      {"\xE2\x82", u"\uFFFD"},
-      {"\xF0\x9F\x8E", u"\uFFFD"},
-      {"\xE2\x82" "A", u"\uFFFDA"},                                 // the breaker is read again
-      {"\xF0\x9F" "\xC3\xA9", u"\uFFFD\u00E9"},
+      {"\x80", u"\uFFFD"}, {"\xBF\x80", u"\uFFFD\uFFFD"},            // lone continuation bytes
+      // Overlong forms: C0 and C1 start nothing.
+      {"\xC0\xAF", u"\uFFFD\uFFFD"}, {"\xC1\xBF", u"\uFFFD\uFFFD"},
+      {"\xE0\x80\xAF", u"\uFFFD\uFFFD\uFFFD"}, {"\xF0\x80\x80\xAF", u"\uFFFD\uFFFD\uFFFD\uFFFD"},
+      // An encoded surrogate, above U+10FFFF, bytes that start nothing.
+      {"\xED\xA0\x80", u"\uFFFD\uFFFD\uFFFD"}, {"\xF4\x90\x80\x80", u"\uFFFD\uFFFD\uFFFD\uFFFD"},
+      {"\xF5\x80", u"\uFFFD\uFFFD"}, {"\xFF", u"\uFFFD"},
+      {"\xC3", u"\uFFFD"}, {"\xE2\x82", u"\uFFFD"}, {"\xF0\x9F\x8E", u"\uFFFD"},  // truncated
+      // The byte that breaks a sequence is read again.
+      {"\xE2\x82" "A", u"\uFFFDA"}, {"\xF0\x9F" "\xC3\xA9", u"\uFFFD\u00E9"},
   };
   // clang-format on
   for (const Case& c : kCases) {
     SCOPED_TRACE(::testing::PrintToString(c.utf8));
     // An exact-size copy, so a read past the end shows under the sanitizers.
-    std::unique_ptr<char[]> exact(new char[c.utf8.size()]);
-    std::memcpy(exact.get(), c.utf8.data(), c.utf8.size());
+    const std::vector<char> exact(c.utf8.begin(), c.utf8.end());
     const bool replaced = c.utf16.find(u'\uFFFD') != std::u16string::npos;
     bool errors = !replaced;
-    const UTF16String out = UTF8to16(std::string_view(exact.get(), c.utf8.size()), &errors);
+    const UTF16String out = UTF8to16(std::string_view(exact.data(), exact.size()), &errors);
     EXPECT_EQ(std::u16string(out.begin(), out.end()), c.utf16);
     EXPECT_EQ(errors, replaced);
   }
@@ -61,10 +53,8 @@ TEST(UTF16to8, ReplacesLoneSurrogates) {
   // clang-format off
   struct Case { std::u16string utf16; std::string utf8; };
   const Case kCases[] = {
-      {u"\xD800", "\xEF\xBF\xBD"},                    // a high surrogate at the end
-      {u"\xDC00", "\xEF\xBF\xBD"},                    // a low surrogate alone
+      {u"\xD800", "\xEF\xBF\xBD"}, {u"\xDC00", "\xEF\xBF\xBD"}, {u"\xD800" "A", "\xEF\xBF\xBD" "A"},
       {u"\xDC00\xD800", "\xEF\xBF\xBD\xEF\xBF\xBD"},  // the wrong order
-      {u"\xD800" "A", "\xEF\xBF\xBD" "A"},
       {u"\xD83C\xDFAC", "\xF0\x9F\x8E\xAC"},          // a proper pair
   };
   // clang-format on
@@ -80,17 +70,14 @@ TEST(UTF16to8, ReplacesLoneSurrogates) {
 TEST(UTF16to8, EveryScalarValueRoundTripsExhaustive) {
   for (char32_t cp = 0; cp <= 0x10FFFF; ++cp) {
     if (cp >= 0xD800 && cp <= 0xDFFF) continue;
-    std::u16string one;
-    if (cp < 0x10000) {
-      one.push_back(static_cast<char16_t>(cp));
-    } else {
-      one.push_back(static_cast<char16_t>(0xD800 + ((cp - 0x10000) >> 10)));
-      one.push_back(static_cast<char16_t>(0xDC00 + ((cp - 0x10000) & 0x3FF)));
-    }
+    const char32_t v = cp - 0x10000;
+    const std::u16string one = cp < 0x10000
+                                   ? std::u16string(1, static_cast<char16_t>(cp))
+                                   : std::u16string{static_cast<char16_t>(0xD800 + (v >> 10)),
+                                                    static_cast<char16_t>(0xDC00 + (v & 0x3FF))};
     bool errors = true;
     const UTF16String back = UTF8to16(UTF16to8(one), &errors);
-    ASSERT_EQ(std::u16string(back.begin(), back.end()), one) << std::hex << cp;
-    ASSERT_FALSE(errors);
+    ASSERT_TRUE(std::u16string(back.begin(), back.end()) == one && !errors) << std::hex << cp;
   }
 }
 
@@ -109,16 +96,13 @@ TEST(UTF16to8, RandomTextRoundTripsAndRandomBytesStayValid) {
     bool errors = true;
     EXPECT_EQ(UTF16to8(View(UTF8to16(utf8, &errors))), utf8);
     EXPECT_FALSE(errors);
-    const UTF16String decoded = UTF8to16(std::string_view(bytes));
-    EXPECT_LE(decoded.size(), bytes.size());
-    UTF8to16(UTF16to8(View(decoded)), &errors);
+    UTF8to16(UTF16to8(View(UTF8to16(std::string_view(bytes)))), &errors);
     EXPECT_FALSE(errors);
   }
 }
 
 TEST(AsciiToUTF16, WidensAsciiAndReplacesHighBytes) {
-  EXPECT_EQ(AsciiToUTF16("Draft 1"), UTF16String(u"Draft 1"));
-  EXPECT_EQ(AsciiToUTF16("a\xC3\xA9"), UTF16String(u"a\uFFFD\uFFFD"));
+  EXPECT_EQ(AsciiToUTF16("D 1\xC3\xA9"), UTF16String(u"D 1\uFFFD\uFFFD"));
 }
 
 TEST(NumberToString, RoundsPadsTrimsAndFitsTheLength) {
@@ -128,29 +112,19 @@ TEST(NumberToString, RoundsPadsTrimsAndFitsTheLength) {
   struct Case { double value; int minInt, fraction; unsigned flags; std::size_t maxLength;
                 const char* text; };
   const Case kCases[] = {
-      {29.97002997, 1, 2, kTrim, 31, "29.97"},
-      {100.0, 1, 2, kTrim, 31, "100"},                       // trailing integer zeros stay
-      {102, 1, 2, 0, 31, "102.00"},
-      {0.5, 1, 0, 0, 31, "1"},                               // an exact half rounds away from zero
-      {-0.5, 1, 0, 0, 31, "-1"},
+      {29.97002997, 1, 2, kTrim, 31, "29.97"}, {102, 1, 2, 0, 31, "102.00"},
+      {100.0, 1, 2, kTrim, 31, "100"}, {1.25, 1, -3, 0, 31, "1"},  // integer zeros stay; -3 is 0
+      {0.5, 1, 0, 0, 31, "1"}, {-0.5, 1, 0, 0, 31, "-1"},    // an exact half rounds away from zero
       {9.995, 1, 2, 0, 31, "9.99"},                          // stored just below the half
       {99.95, 1, 1, 0, 31, "100.0"},                         // just above; the carry adds a digit
-      {-0.0, 1, 2, 0, 31, "0.00"},
-      {-0.001, 1, 2, 0, 31, "0.00"},                         // rounds to zero: no sign
-      {-1.5, 3, 1, 0, 31, "-001.5"},
-      {1.5, 1, 1, kPlus, 31, "+1.5"},
-      {0.0, 1, 1, kPlus, 31, "0.0"},
-      {1.25, 1, -3, 0, 31, "1"},                             // fraction digits below 0 mean 0
-      {0.1, 1, 40, 0, 31, "0.10000000000000001"},            // and above 17 as 17
+      {-0.0, 1, 2, 0, 31, "0.00"}, {-0.001, 1, 2, 0, 31, "0.00"},  // rounds to zero: no sign
+      {-1.5, 3, 1, 0, 31, "-001.5"}, {1.5, 1, 1, kPlus, 31, "+1.5"}, {0.0, 1, 1, kPlus, 31, "0.0"},
+      {0.1, 1, 40, 0, 31, "0.10000000000000001"},            // fraction digits above 17 mean 17
       {1e31, 1, 0, 0, 31, "9999999999999999635896294965248"},  // 31 digits still fit
-      {1e40, 1, 0, kTrim, 31, "1e+40"},
-      {-DBL_MAX, 1, 17, kTrim, 31, "-1.7976931348623157e+308"},
-      {123456789.0, 1, 2, 0, 8, "1.23e+08"},
-      {DBL_MAX, 1, 2, 0, 7, "2e+308"},
-      {DBL_MAX, 1, 2, 0, 0, "2e+308"},                       // nothing fits: the shortest form
-      {std::nan(""), 1, 2, 0, 31, "nan"},
-      {HUGE_VAL, 1, 2, kPlus, 31, "+inf"},
-      {-HUGE_VAL, 1, 2, 0, 31, "-inf"},
+      {1e40, 1, 0, kTrim, 31, "1e+40"}, {-DBL_MAX, 1, 17, kTrim, 31, "-1.7976931348623157e+308"},
+      {123456789.0, 1, 2, 0, 8, "1.23e+08"}, {DBL_MAX, 1, 2, 0, 7, "2e+308"},
+      {DBL_MAX, 1, 2, 0, 0, "2e+308"}, {std::nan(""), 1, 2, 0, 31, "nan"},  // 0: the shortest form
+      {HUGE_VAL, 1, 2, kPlus, 31, "+inf"}, {-HUGE_VAL, 1, 2, 0, 31, "-inf"},
   };
   // clang-format on
   for (const Case& c : kCases) {
@@ -198,8 +172,7 @@ TEST(StringToNumber, ReadsWholeDecimalTokensOnly) {
     SCOPED_TRACE(Narrow(c.text));
     double value = -123.0;
     EXPECT_TRUE(StringToNumber(c.text, value));
-    EXPECT_EQ(value, c.value);
-    EXPECT_EQ(std::signbit(value), std::signbit(c.value));
+    EXPECT_TRUE(value == c.value && std::signbit(value) == std::signbit(c.value)) << value;
   }
   for (const char16_t* text : kBad) {
     SCOPED_TRACE(Narrow(text));
@@ -213,14 +186,9 @@ TEST(ReplaceInString, FillsNumberedSlotsOnce) {
   // clang-format off
   struct Case { const char16_t* text; const char16_t* expected; };
   const Case kCases[] = {
-      {u"@1/@0 fps", u"B/A fps"},
-      {u"@0@0@9.", u"AAJ."},
-      {u"@3", u""},          // an empty replacement
-      {u"50@", u"50@"},      // '@' at the end stays
-      {u"a@b", u"a@b"},      // '@' before a letter stays
-      {u"@@0", u"@0"},       // "@@" is a literal '@'
-      {u"@@@0", u"@A"},
-      {u"", u""},
+      {u"@1/@0 fps", u"B/A fps"}, {u"@0@0@9.", u"AAJ."}, {u"", u""}, {u"@3", u""},
+      {u"50@", u"50@"}, {u"a@b", u"a@b"},     // '@' at the end or before a letter stays
+      {u"@@0", u"@0"}, {u"@@@0", u"@A"},      // "@@" is a literal '@'
   };
   // clang-format on
   const UTF16String a = u"A", b = u"B", j = u"J";
@@ -234,11 +202,9 @@ TEST(ReplaceInString, FillsNumberedSlotsOnce) {
 }
 
 TEST(Trim, RemovesAsciiWhiteSpaceAtOneEnd) {
-  EXPECT_EQ(LeftTrim(u" \t\r\n\v\fa b \t"), UTF16String(u"a b \t"));
-  EXPECT_EQ(RightTrim(u" \ta b \t\r\n\v\f"), UTF16String(u" \ta b"));
-  EXPECT_EQ(LeftTrim(u"   "), UTF16String());
-  EXPECT_EQ(RightTrim(u"   "), UTF16String());
-  EXPECT_EQ(LeftTrim(u"\u00A0x"), UTF16String(u"\u00A0x"));
+  EXPECT_EQ(LeftTrim(u" \t\r\n\v\fa b \t") + u"|" + LeftTrim(u"   ") + u"|" + LeftTrim(u"\u00A0x"),
+            UTF16String(u"a b \t||\u00A0x"));
+  EXPECT_EQ(RightTrim(u" \ta b \t\r\n\v\f") + u"|" + RightTrim(u"   "), UTF16String(u" \ta b|"));
 }
 
 TEST(UTF16OStream, FormatsLikeTheDefaultNarrowStreamAndFlushesOnEndl) {
@@ -258,35 +224,28 @@ TEST(UTF16OStream, FormatsLikeTheDefaultNarrowStreamAndFlushesOnEndl) {
   EXPECT_EQ(out.flushes, 2);
 }
 
-TEST(iUTF16StringStream, ReadsTokensAndNumbers) {
-  iUTF16StringStream in(u"  hello 29.97\t-12  +5 ");
+TEST(iUTF16StringStream, ReadsTokensAndNumbersAndAFailedReadLeavesTheTargetAndStops) {
+  iUTF16StringStream good(u"  hello 29.97\t-12  +5 ");
   UTF16String word;
   double fps = 0;
   std::int64_t a = 0, b = 0;
-  EXPECT_TRUE(in >> word >> fps >> a >> b);
+  EXPECT_TRUE(good >> word >> fps >> a >> b);
   oUTF16StringStream out;
-  out << word << '|' << fps << '|' << a << '|' << b << '|' << in.rest();
+  out << word << '|' << fps << '|' << a << '|' << b << '|' << good.rest();
   EXPECT_EQ(Narrow(out.str()), "hello|29.97|-12|5| ");
-}
-
-TEST(iUTF16StringStream, AFailedReadLeavesTheTargetAndFailsLaterReads) {
   const char16_t* const kCases[] = {u"abc 5", u"1.5 5", u"9223372036854775808 5",
                                     u"+-1 5", u"",      u"12x 5"};
   for (const char16_t* text : kCases) {
     SCOPED_TRACE(Narrow(text));
     iUTF16StringStream in(text);
     std::int64_t value = 77, next = 77;
-    in >> value >> next;  // the good "5" is not read after a failure
-    EXPECT_FALSE(in);
+    EXPECT_FALSE(in >> value >> next);  // the good "5" is not read after a failure
     EXPECT_EQ(value, 77);
     EXPECT_EQ(next, 77);
   }
   iUTF16StringStream in(u"x");
   double d = 3.0;
-  in >> d;
-  EXPECT_FALSE(in);
-  EXPECT_EQ(d, 3.0);
-  EXPECT_EQ(in.rest(), u"x");
+  EXPECT_TRUE(!(in >> d) && d == 3.0 && in.rest() == u"x");
 }
 
 }  // namespace
