@@ -9,9 +9,7 @@
 namespace zebmediatypes {
 namespace {
 
-const TickTime sec1 = kTime_OneSecond;
-const TickTime sec2 = kTime_OneSecond * 2;
-const TickTime sec3 = kTime_OneSecond * 3;
+const TickTime sec1 = kTime_OneSecond, sec2 = sec1 * 2, sec3 = sec1 * 3;
 
 TEST(TimeRange, DurationIsInvalidWithoutBothEnds) {
   // clang-format off
@@ -37,8 +35,7 @@ TEST(TimeRange, StartPlusDurationSaturatesAtTimeMax) {
       {"invalid start", kTime_Invalid, sec1, kTime_Invalid}, {"invalid duration", sec1, kTime_Invalid, kTime_Invalid}};
   // clang-format on
   for (const auto& [label, start, duration, end] : kCases) {
-    SCOPED_TRACE(label);
-    EXPECT_EQ(TimeRange(start, TimeRange::Duration(duration)), TimeRange(start, end));
+    EXPECT_EQ(TimeRange(start, TimeRange::Duration(duration)), TimeRange(start, end)) << label;
   }
 }
 
