@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <array>
 #include <chrono>
+#include <iomanip>
 #include <limits>
 #include <random>
 #include <sstream>
@@ -145,9 +146,7 @@ TEST(TickTime, AlignmentGoldenValues) {
   // from zero.
   // clang-format off
   const std::pair<std::int64_t, Aligned3> kCases[] = {
-      {p24 / 2, {0, p24, p24}}, {-p24 / 2, {0, 0, -p24}}, {p24 / 2 - 1, {0, p24, 0}},
-      {-3 * p24 / 2, {-p24, 0, -2 * p24}}, {-2 * p24, {-2 * p24, -p24, -2 * p24}},
-  };
+      {p24 / 2, {0, p24, p24}}, {-p24 / 2, {0, 0, -p24}}, {-3 * p24 / 2, {-p24, 0, -2 * p24}}, {-2 * p24, {-2 * p24, -p24, -2 * p24}}};
   // clang-format on
   for (const auto& [t, want] : kCases) EXPECT_EQ(Aligned(t, kFrameRate_Video24), want) << t;
 }
@@ -162,34 +161,30 @@ void ExpectAlignmentAgrees(std::int64_t t, std::int64_t p) {
   const Wide ceil = std::min<Wide>(towardZero(Wide{t} + p - 1), kInt64Max - kInt64Max % p);
   const Wide nearest = towardZero(t >= 0 ? Wide{t} + p / 2 : Wide{t} - p / 2);
   const Wide clamped = std::clamp<Wide>(nearest, kTime_Min.GetTicks(), kTime_Max.GetTicks());
-  const Aligned3 expected = {static_cast<std::int64_t>(towardZero(t)),
-                             static_cast<std::int64_t>(ceil), static_cast<std::int64_t>(clamped)};
-  EXPECT_EQ(Aligned(t, FrameRate(p)), expected) << t << " / " << p;
+  EXPECT_EQ(Aligned(t, FrameRate(p)),
+            (Aligned3{std::int64_t(towardZero(t)), std::int64_t(ceil), std::int64_t(clamped)}))
+      << t << " / " << p;
 }
 
 TEST(TickTime, AlignmentAtTheInt64LimitsDoesNotOverflow) {
   // Nearest clamps to the bound on t's side; so does it 200 hours out.
   const std::int64_t h200 = 200 * kTime_OneHour.GetTicks();
-  for (std::int64_t p : {kFrameRate_Video29_97.GetTicksPerFrame(), std::int64_t{1}, std::int64_t{2},
-                         kInt64Max / 2, kInt64Max - 1}) {
-    for (std::int64_t t : {kInt64Max, kInt64Max - 1, kInt64Min, kInt64Min + 1, h200, -h200}) {
-      ExpectAlignmentAgrees(t, p);
-    }
+  // clang-format off
+  for (std::int64_t p : {kFrameRate_Video29_97.GetTicksPerFrame(), std::int64_t{1}, std::int64_t{2}, kInt64Max / 2, kInt64Max - 1}) {
+    for (std::int64_t t : {kInt64Max, kInt64Max - 1, kInt64Min, kInt64Min + 1, h200, -h200}) ExpectAlignmentAgrees(t, p);
   }
+  // clang-format on
 }
 
 TEST(TickTime, AlignmentAgreesWithWideArithmetic) {
   // Every frame boundary and half frame around zero at real rates.
-  for (std::int64_t p :
-       {kFrameRate_Video23_976.GetTicksPerFrame(), kFrameRate_Video29_97.GetTicksPerFrame(),
-        kFrameRate_Audio44100.GetTicksPerFrame(), std::int64_t{7}, std::int64_t{2}}) {
+  // clang-format off
+  for (std::int64_t p : {kFrameRate_Video23_976.GetTicksPerFrame(), kFrameRate_Video29_97.GetTicksPerFrame(), kFrameRate_Audio44100.GetTicksPerFrame(), std::int64_t{7}, std::int64_t{2}}) {
     for (std::int64_t k = -20; k <= 20; ++k) {
-      for (std::int64_t offset :
-           {std::int64_t{0}, std::int64_t{1}, p / 2 - 1, p / 2, p / 2 + 1, p - 1}) {
-        ExpectAlignmentAgrees(k * p + offset, p);
-      }
+      for (std::int64_t offset : {std::int64_t{0}, std::int64_t{1}, p / 2 - 1, p / 2, p / 2 + 1, p - 1}) ExpectAlignmentAgrees(k * p + offset, p);
     }
   }
+  // clang-format on
   // Rates from 1 tick to near INT64_MAX, times anywhere in the 64-bit range.
   std::mt19937_64 random(20000);  // the standard fixes this engine's sequence
   for (int i = 0; i < 20000; ++i) {
@@ -246,38 +241,22 @@ TEST(FrameRate, IsFrameRateAudioCoversOnlyTheHighSampleRates) {
   }
 }
 
-TEST(FrameRate, TextForms) {
-  // clang-format off
-  const std::pair<FrameRate, const char*> kCases[] = {
-      {kFrameRate_Video23_976, "23.976"}, {kFrameRate_Video29_97, "29.97"}, {kFrameRate_Video119_88, "119.88"},
-      {kFrameRate_Video25, "25"}, {kFrameRate_Audio44100, "44100"}, {kFrameRate_Invalid, "0"}};
-  // clang-format on
-  for (const auto& [rate, text] : kCases) {
-    std::ostringstream narrow;
-    zebcore::string::oUTF16StringStream wide;
-    narrow << rate;
-    wide << rate;
-    EXPECT_EQ(narrow.str() + Utf8(wide.str()), std::string(text) + text);
-    EXPECT_EQ(zebcore::string::ToStdString(FrameRateToUTF8String(rate)), text);
-  }
-}
-
-TEST(TickTime, TextForms) {
-  std::ostringstream narrow, printed;
-  narrow.precision(3);
-  narrow << TickTime(30, kFrameRate_Video29_97);
-  EXPECT_EQ(narrow.str(), "1");
+TEST(TickTime, TextFormsOfTimesAndRates) {
+  // Rates not written here show in the frame rate descriptions.
+  std::ostringstream narrow;
   zebcore::string::oUTF16StringStream wide;
-  wide << TickTime(30, kFrameRate_Video29_97) << u" " << kTime_OneSecond / 3;
-  EXPECT_EQ(Utf8(wide.str()), "1.001 0.333333");
-  PrintTo(kTime_OneSecond, &printed);
-  EXPECT_EQ(printed.str(), "254016000000 ticks");
+  narrow << std::setprecision(3) << TickTime(30, kFrameRate_Video29_97) << " ";
+  PrintTo(kTime_OneSecond, &narrow);
+  narrow << " " << kFrameRate_Video23_976 << " " << kFrameRate_Video119_88;
+  wide << TickTime(30, kFrameRate_Video29_97) << u" " << kTime_OneSecond / 3 << u" "
+       << kFrameRate_Audio44100 << u" " << kFrameRate_Invalid;
+  EXPECT_EQ(narrow.str() + " " + Utf8(wide.str()),
+            "1 254016000000 ticks 23.976 119.88 1.001 0.333333 44100 0");
+  EXPECT_EQ(zebcore::string::ToStdString(FrameRateToUTF8String(kFrameRate_Video29_97)), "29.97");
   // clang-format off
   const std::tuple<TickTime, FrameRate, const char*> kCases[] = {
       {kTime_OneSecond, kFrameRate_Video24, "which is 24 frames at 24fps"}, {kTime_OneSecond / 2, kFrameRate_Video25, "which is 12.5 frames at 25fps"},
-      {kTime_OneSecond, kFrameRate_Audio8000, "which is 8000 samples at 8000Hz"}, {kTime_OneSecond, kFrameRate_Video48, "which is 48 frames at 48fps"},
-      {kTime_OneSecond * 2, kFrameRate_Invalid, "which is 2 seconds"},
-  };
+      {kTime_OneSecond, kFrameRate_Audio8000, "which is 8000 samples at 8000Hz"}, {kTime_OneSecond, kFrameRate_Video48, "which is 48 frames at 48fps"}};
   // clang-format on
   for (const auto& [time, rate, text] : kCases) {
     EXPECT_EQ(details::ExplainTickTimeWithFrameRate(time, rate), text);
@@ -294,9 +273,8 @@ TEST(TickTime, JSONRoundTripAndBadForms) {
     return zebcore::string::ToStdString(zebcore::serialization::ToJSONText(t));
   };
   EXPECT_EQ(write(kTime_OneSecond), R"({"ticks":254016000000})");
-  for (TickTime t : {kTime_Zero, kTime_Invalid, TickTime(kInt64Max), TickTime(kInt64Min)}) {
-    EXPECT_EQ(read(write(t)), t) << write(t);
-  }
+  for (TickTime t : {kTime_Zero, kTime_Invalid, TickTime(kInt64Max), TickTime(kInt64Min)})
+    EXPECT_EQ(read(write(t)), t);
   EXPECT_EQ(read(R"({"other":5})"), kTime_Zero);
   for (const char* bad : {R"({"ticks":"5"})", R"({"ticks":1.5})", R"({"ticks":null})",
                           R"({"ticks":{}})", R"({"ticks":true})", "5", "[]"}) {
