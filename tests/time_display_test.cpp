@@ -40,17 +40,24 @@ TEST(TimeDisplay, OrderingIsStrictAndConsistent) {
   ordered.emplace_back(kTimeDisplay_Invalid);
   for (std::size_t i = 0; i < ordered.size(); ++i) {
     for (std::size_t j = 0; j < ordered.size(); ++j) {
-      SCOPED_TRACE(testing::Message() << i << " " << j);
       const TimeDisplay a = ordered[i], b = ordered[j];
-      EXPECT_EQ(a == b, i == j);
-      EXPECT_EQ(a < b, i < j);
-      EXPECT_EQ(a <= b, i <= j);
+      EXPECT_EQ(std::make_tuple(a == b, a < b, a <= b), std::make_tuple(i == j, i < j, i <= j))
+          << i << " " << j;
     }
   }
 }
 
-TEST(TimeDisplay, CustomCountIsAtLeastOneAndOnlyForCustom) {
-  TimeDisplay display = TimeDisplay::CreateCustom(12);
+TEST(TimeDisplay, CustomCountIsAtLeastOneAndAMissingCountLogsAWarning) {
+  std::vector<std::string> logged;
+  auto previous = zebcore::logging::SetLogSink(
+      [&logged](const zebcore::logging::LogRecord& r) { logged.push_back(r.message); });
+  TimeDisplay display(kTimeDisplay_CustomFrameRateTimecode);
+  zebcore::logging::SetLogSink(previous);
+  EXPECT_EQ(logged,
+            std::vector<std::string>{
+                "WARNING: A custom TimeDisplay was created without a frame rate; using default"});
+  EXPECT_EQ(display, TimeDisplay::CreateCustom(30));
+  display = TimeDisplay::CreateCustom(12);
   display.SetType(kTimeDisplay_25Timecode);
   EXPECT_EQ(display.GetCustomFramesPerSecond(), 30u);
   display.SetCustomFramesPerSecond(0);
@@ -62,58 +69,39 @@ TEST(TimeDisplay, CustomCountIsAtLeastOneAndOnlyForCustom) {
             TimeDisplay::CreateCustom(100));
 }
 
-TEST(TimeDisplay, CustomWithoutCountLogsAWarning) {
-  std::vector<zebcore::logging::LogRecord> records;
-  auto previous = zebcore::logging::SetLogSink(
-      [&records](const zebcore::logging::LogRecord& r) { records.push_back(r); });
-  const TimeDisplay display(kTimeDisplay_CustomFrameRateTimecode);
-  zebcore::logging::SetLogSink(previous);
-  EXPECT_EQ(display, TimeDisplay::CreateCustom(30));
-  ASSERT_EQ(records.size(), 1u);
-  EXPECT_EQ(records[0].message,
-            "WARNING: A custom TimeDisplay was created without a frame rate; using default");
-}
-
 TEST(TimeDisplay, PerDisplayProperties) {
   const FrameRate kMedia = FrameRate(12345), kNone = kFrameRate_Invalid;
+  // display fps, nominal rate, drop, drop applicable, hmsf, audio, frames per foot, frame width.
+  // The other fixed-rate displays take the path of 25; their counts show in the timecode tests.
+  using Props = std::tuple<std::int64_t, FrameRate, bool, bool, bool, bool, int, int>;
   // clang-format off
-  struct Case { TimeDisplayType type; std::int64_t fps; FrameRate nominal; bool drop, dropApplicable, hmsf, audio; int framesPerFoot, width; };
-  const Case kCases[] = {
-      {kTimeDisplay_24Timecode, 24, kFrameRate_Video24, false, false, true, false, 0, 2},
-      {kTimeDisplay_25Timecode, 25, kFrameRate_Video25, false, false, true, false, 0, 2},
-      {kTimeDisplay_2997DropTimecode, 30, kFrameRate_Video29_97, true, true, true, false, 0, 2},
-      {kTimeDisplay_2997NonDropTimecode, 30, kFrameRate_Video29_97, false, true, true, false, 0, 2},
-      {kTimeDisplay_30Timecode, 30, kFrameRate_Video30, false, false, true, false, 0, 2},
-      {kTimeDisplay_50Timecode, 50, kFrameRate_Video50, false, false, true, false, 0, 2},
-      {kTimeDisplay_5994DropTimecode, 60, kFrameRate_Video59_94, true, true, true, false, 0, 2},
-      {kTimeDisplay_5994NonDropTimecode, 60, kFrameRate_Video59_94, false, true, true, false, 0, 2},
-      {kTimeDisplay_60Timecode, 60, kFrameRate_Video60, false, false, true, false, 0, 2},
-      {kTimeDisplay_Frames, 30, kMedia, false, false, false, false, 0, 2},
-      {kTimeDisplay_23976Timecode, 24, kFrameRate_Video23_976, false, false, true, false, 0, 2},
-      {kTimeDisplay_16mmFeetFrames, 30, kMedia, false, false, false, false, 40, 2},
-      {kTimeDisplay_35mmFeetFrames, 30, kMedia, false, false, false, false, 16, 2},
-      {kTimeDisplay_48Timecode, 48, kFrameRate_Video48, false, false, true, false, 0, 2},
-      {kTimeDisplay_11988Timecode, 12, kFrameRate_Video11_988, false, false, true, false, 0, 2},
-      {kTimeDisplay_14985Timecode, 15, kFrameRate_Video14_985, false, false, true, false, 0, 2},
-      {kTimeDisplay_AudioSamplesTimecode, 30, kMedia, false, false, true, true, 0, 2},
-      {kTimeDisplay_AudioMsTimecode, 1000, kFrameRate_Milliseconds, false, false, true, true, 0, 3},
-      {kTimeDisplay_Invalid, 30, kNone, false, false, false, false, 0, 2},
-      {TimeDisplayType(150), 30, kNone, false, false, true, false, 0, 2},
+  const std::pair<TimeDisplayType, Props> kCases[] = {
+      {kTimeDisplay_25Timecode, {25, kFrameRate_Video25, false, false, true, false, 0, 2}},
+      {kTimeDisplay_2997DropTimecode, {30, kFrameRate_Video29_97, true, true, true, false, 0, 2}},
+      {kTimeDisplay_2997NonDropTimecode, {30, kFrameRate_Video29_97, false, true, true, false, 0, 2}},
+      {kTimeDisplay_5994DropTimecode, {60, kFrameRate_Video59_94, true, true, true, false, 0, 2}},
+      {kTimeDisplay_5994NonDropTimecode, {60, kFrameRate_Video59_94, false, true, true, false, 0, 2}},
+      {kTimeDisplay_Frames, {30, kMedia, false, false, false, false, 0, 2}},
+      {kTimeDisplay_16mmFeetFrames, {30, kMedia, false, false, false, false, 40, 2}},
+      {kTimeDisplay_35mmFeetFrames, {30, kMedia, false, false, false, false, 16, 2}},
+      {kTimeDisplay_11988Timecode, {12, kFrameRate_Video11_988, false, false, true, false, 0, 2}},
+      {kTimeDisplay_14985Timecode, {15, kFrameRate_Video14_985, false, false, true, false, 0, 2}},
+      {kTimeDisplay_AudioSamplesTimecode, {30, kMedia, false, false, true, true, 0, 2}},
+      {kTimeDisplay_AudioMsTimecode, {1000, kFrameRate_Milliseconds, false, false, true, true, 0, 3}},
+      {kTimeDisplay_Invalid, {30, kNone, false, false, false, false, 0, 2}},
+      {TimeDisplayType(150), {30, kNone, false, false, true, false, 0, 2}},
   };
   // clang-format on
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(static_cast<int>(c.type));
-    const TimeDisplay d(c.type);
-    EXPECT_EQ(d.GetDisplayFramesPerSecond(), c.fps);
-    EXPECT_EQ(GetFrameRateForTimeDisplay(d, kMedia), c.nominal);
-    EXPECT_EQ(IsTimeDisplayDropFrame(d), c.drop);
-    EXPECT_EQ(IsDropFrameApplicableForTimeDisplay(d), c.dropApplicable);
-    EXPECT_EQ(IsHMSFTimeDisplay(d, false), c.hmsf);
-    EXPECT_EQ(IsTimeDisplayFormatAudio(d), c.audio);
-    EXPECT_EQ(GetFramesPerFoot(d), c.framesPerFoot);
-    EXPECT_EQ(IsFeetFramesDisplay(d), c.framesPerFoot != 0);
-    EXPECT_EQ(d.HasFramesPerSecond(), c.nominal != kMedia);
-    EXPECT_EQ(GetTimeDisplayFrameStringWidth(d), c.width);
+  for (const auto& [type, props] : kCases) {
+    const TimeDisplay d(type);
+    const FrameRate nominal = GetFrameRateForTimeDisplay(d, kMedia);
+    const Props actual(d.GetDisplayFramesPerSecond(), nominal, IsTimeDisplayDropFrame(d),
+                       IsDropFrameApplicableForTimeDisplay(d), IsHMSFTimeDisplay(d, false),
+                       IsTimeDisplayFormatAudio(d), GetFramesPerFoot(d),
+                       GetTimeDisplayFrameStringWidth(d));
+    EXPECT_EQ(actual, props) << type;
+    EXPECT_EQ(IsFeetFramesDisplay(d), GetFramesPerFoot(d) != 0) << type;
+    EXPECT_EQ(d.HasFramesPerSecond(), nominal != kMedia) << type;
   }
   EXPECT_TRUE(IsHMSFTimeDisplay(TimeDisplay(kTimeDisplay_Frames), true));
   EXPECT_TRUE(IsHMSFTimeDisplay(TimeDisplay::CreateCustom(12), false));
@@ -141,10 +129,9 @@ TEST(TimeDisplay, DisplayFramesPerSecondFromTheMediaRateIsAtLeastOne) {
       {kFrameRate_Invalid, 1}, {FrameRate(0), 1}, {FrameRate(-5), 1}, {FrameRate(254016000000 * 4), 1}};
   // clang-format on
   for (const auto& [rate, fps] : kCases) {
-    SCOPED_TRACE(rate.GetTicksPerFrame());
     for (TimeDisplayType t : {kTimeDisplay_Frames, kTimeDisplay_16mmFeetFrames,
                               kTimeDisplay_35mmFeetFrames, kTimeDisplay_AudioSamplesTimecode}) {
-      EXPECT_EQ(TimeDisplay(t).GetDisplayFramesPerSecond(rate), fps);
+      EXPECT_EQ(TimeDisplay(t).GetDisplayFramesPerSecond(rate), fps) << rate.GetTicksPerFrame();
     }
     EXPECT_EQ(TimeDisplay(kTimeDisplay_25Timecode).GetDisplayFramesPerSecond(rate), 25);
   }
@@ -152,34 +139,28 @@ TEST(TimeDisplay, DisplayFramesPerSecondFromTheMediaRateIsAtLeastOne) {
 
 TEST(TimeDisplay, DisplayForARate) {
   const TimeDisplay kDrop(kTimeDisplay_2997DropTimecode), kFrames(kTimeDisplay_Frames);
-  const TimeDisplay k35mm(kTimeDisplay_35mmFeetFrames);
+  const TimeDisplay k35mm(kTimeDisplay_35mmFeetFrames), kCustom1 = TimeDisplay::CreateCustom(1);
+  // 8 kHz is no audio rate here; no rate falls back to the given type.
   // clang-format off
-  struct Case { const char* label; FrameRate rate; bool drop, ms; TimeDisplayType fallback; TimeDisplay expected; };
-  const Case kCases[] = {
-      {"29.97 non-drop", kFrameRate_Video29_97, false, false, kDrop.GetType(), TimeDisplay(kTimeDisplay_2997NonDropTimecode)},
-      {"59.94 drop", kFrameRate_Video59_94, true, false, kDrop.GetType(), TimeDisplay(kTimeDisplay_5994DropTimecode)},
-      {"25 drop asked", kFrameRate_Video25, true, false, kDrop.GetType(), TimeDisplay(kTimeDisplay_25Timecode)},
-      {"11.988", kFrameRate_Video11_988, false, false, kDrop.GetType(), TimeDisplay(kTimeDisplay_11988Timecode)},
-      {"48 kHz", kFrameRate_Audio48000, false, false, kDrop.GetType(), TimeDisplay(kTimeDisplay_AudioSamplesTimecode)},
-      {"8 kHz is not an audio rate here", kFrameRate_Audio8000, false, false, kDrop.GetType(), TimeDisplay::CreateCustom(8000)},
-      {"ms allowed", kFrameRate_Milliseconds, false, true, kDrop.GetType(), TimeDisplay(kTimeDisplay_AudioMsTimecode)},
-      {"ms not allowed", kFrameRate_Milliseconds, false, false, kDrop.GetType(), TimeDisplay::CreateCustom(1000)},
-      {"119.88", kFrameRate_Video119_88, false, false, kDrop.GetType(), TimeDisplay::CreateCustom(120)},
-      {"invalid, fallback 102", kFrameRate_Invalid, false, false, kDrop.GetType(), kDrop},
-      {"invalid, fallback custom", kFrameRate_Invalid, false, false, kTimeDisplay_CustomFrameRateTimecode, TimeDisplay::CreateCustom(1)},
-      {"zero ticks", FrameRate(0), false, false, kDrop.GetType(), TimeDisplay::CreateCustom(1)},
+  const std::tuple<FrameRate, bool, bool, TimeDisplay> kCases[] = {
+      {kFrameRate_Video29_97, false, false, TimeDisplay(kTimeDisplay_2997NonDropTimecode)}, {kFrameRate_Video59_94, true, false, TimeDisplay(kTimeDisplay_5994DropTimecode)},
+      {kFrameRate_Video25, true, false, TimeDisplay(kTimeDisplay_25Timecode)}, {kFrameRate_Video11_988, false, false, TimeDisplay(kTimeDisplay_11988Timecode)},
+      {kFrameRate_Audio48000, false, false, TimeDisplay(kTimeDisplay_AudioSamplesTimecode)}, {kFrameRate_Audio8000, false, false, TimeDisplay::CreateCustom(8000)},
+      {kFrameRate_Milliseconds, false, true, TimeDisplay(kTimeDisplay_AudioMsTimecode)}, {kFrameRate_Milliseconds, false, false, TimeDisplay::CreateCustom(1000)},
+      {kFrameRate_Video119_88, false, false, TimeDisplay::CreateCustom(120)}, {kFrameRate_Invalid, false, false, kDrop}, {FrameRate(0), false, false, kCustom1},
   };
   // clang-format on
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.label);
-    EXPECT_EQ(GetTimeDisplayForFrameRate(c.rate, c.drop, true, c.fallback, c.ms), c.expected);
-    EXPECT_EQ(GetTimeDisplayForFrameRate(c.rate, c.drop, false, c.fallback, c.ms), c.expected);
+  for (const auto& [rate, drop, ms, expected] : kCases) {
+    EXPECT_EQ(GetTimeDisplayForFrameRate(rate, drop, false, kDrop.GetType(), ms), expected)
+        << rate.GetTicksPerFrame() << " " << drop << ms;
   }
+  EXPECT_EQ(GetTimeDisplayForFrameRate(kFrameRate_Invalid, false, false,
+                                       kTimeDisplay_CustomFrameRateTimecode, false),
+            kCustom1);
   // For durations: frames and feet+frames stay unless timecode is forced.
   // clang-format off
   const std::tuple<FrameRate, TimeDisplay, bool, TimeDisplay> kDurations[] = {
-      {kFrameRate_Video25, kFrames, false, kFrames}, {kFrameRate_Video25, k35mm, false, k35mm},
-      {kFrameRate_Video25, kFrames, true, TimeDisplay(kTimeDisplay_25Timecode)},
+      {kFrameRate_Video25, kFrames, false, kFrames}, {kFrameRate_Video25, k35mm, false, k35mm}, {kFrameRate_Video25, kFrames, true, TimeDisplay(kTimeDisplay_25Timecode)},
       {kFrameRate_Video29_97, TimeDisplay(kTimeDisplay_AudioSamplesTimecode), false, TimeDisplay(kTimeDisplay_2997NonDropTimecode)},
       {kFrameRate_Video29_97, kDrop, false, kDrop}, {kFrameRate_Invalid, TimeDisplay(), false, kDrop}};
   // clang-format on
@@ -193,8 +174,9 @@ TEST(TimeDisplay, JSONRoundTripAndOlderAndBadForms) {
   displays.emplace_back();
   for (unsigned fps : {1u, 12u, 4294967295u}) displays.push_back(TimeDisplay::CreateCustom(fps));
   for (TimeDisplay d : displays) {
-    const auto text = zebcore::serialization::ToJSONText(d);
-    EXPECT_EQ(ReadJSON(zebcore::string::ToStdString(text).c_str()), d) << d.GetType();
+    EXPECT_EQ(ReadJSON(zebcore::string::ToStdString(zebcore::serialization::ToJSONText(d)).c_str()),
+              d)
+        << d.GetType();
   }
   EXPECT_EQ(zebcore::string::ToStdString(
                 zebcore::serialization::ToJSONText(TimeDisplay::CreateCustom(12))),
@@ -225,16 +207,10 @@ TEST(TimeDisplay, TextFormsAndDescriptions) {
   // clang-format off
   const std::tuple<TimeDisplay, const char*, const char*> kCases[] = {
       {TimeDisplay(kTimeDisplay_2997DropTimecode), "29.97 fps Drop-Frame", "29.97 fps Drop-Frame Timecode"},
-      {TimeDisplay(kTimeDisplay_24Timecode), "24 fps", "24 fps Timecode"},
-      {TimeDisplay(kTimeDisplay_35mmFeetFrames), "Feet + Frames 35 mm", "Feet + Frames 35 mm"},
-      {TimeDisplay(kTimeDisplay_AudioMsTimecode), "Milliseconds", "Milliseconds"},
-      {TimeDisplay::CreateCustom(12), "Custom fps", "12 fps Timecode"},
-      {TimeDisplay(kTimeDisplay_Invalid), "", ""},
-      {TimeDisplay(116u), "", ""},
-  };
+      {TimeDisplay(kTimeDisplay_35mmFeetFrames), "Feet + Frames 35 mm", "Feet + Frames 35 mm"}, {TimeDisplay::CreateCustom(12), "Custom fps", "12 fps Timecode"},
+      {TimeDisplay(kTimeDisplay_Invalid), "", ""}, {TimeDisplay(116u), "", ""}};
   // clang-format on
-  for (const auto& [display, plain, localized] : kCases) {
-    SCOPED_TRACE(plain);
+  for (const auto& [display, plain, localized] : kCases) {  // forms 0 and 2 are the plain one
     EXPECT_EQ(Utf8(TimeDisplayDescription(display, 0)), plain);
     EXPECT_EQ(Utf8(TimeDisplayDescription(display, 2)), plain);
     EXPECT_EQ(Utf8(TimeDisplayDescription(display, 1)), localized);

@@ -9,9 +9,7 @@
 namespace zebmediatypes {
 namespace {
 
-const TickTime sec1 = kTime_OneSecond;
-const TickTime sec2 = kTime_OneSecond * 2;
-const TickTime sec3 = kTime_OneSecond * 3;
+const TickTime sec1 = kTime_OneSecond, sec2 = sec1 * 2, sec3 = sec1 * 3;
 
 TEST(TimeRange, DurationIsInvalidWithoutBothEnds) {
   // clang-format off
@@ -29,16 +27,13 @@ TEST(TimeRange, StartPlusDurationSaturatesAtTimeMax) {
   const std::int64_t kInt64Max = std::numeric_limits<std::int64_t>::max();
   // clang-format off
   const std::tuple<const char*, TickTime, TickTime, TickTime> kCases[] = {
-      {"start and duration", sec1, sec2, sec3}, {"negative duration", sec3, -sec2, sec1},
-      {"200 hours", sec1, kTime_OneHour * 200, kTime_Max}, {"just fits", kTime_Max - sec1, sec1, kTime_Max},
-      {"one tick over", kTime_Max - sec1, sec1 + TickTime(1), kTime_Max},
+      {"start and duration", sec1, sec2, sec3}, {"negative duration", sec3, -sec2, sec1}, {"just fits", kTime_Max - sec1, sec1, kTime_Max},
+      {"one tick over", kTime_Max - sec1, sec1 + TickTime(1), kTime_Max}, {"huge duration", sec1, TickTime(kInt64Max), kTime_Max},
       {"sum beyond int64", TickTime(kInt64Max - 5), TickTime(10), kTime_Max},  // the raw sum wraps
-      {"huge duration", sec1, TickTime(kInt64Max), kTime_Max},
       {"invalid start", kTime_Invalid, sec1, kTime_Invalid}, {"invalid duration", sec1, kTime_Invalid, kTime_Invalid}};
   // clang-format on
   for (const auto& [label, start, duration, end] : kCases) {
-    SCOPED_TRACE(label);
-    EXPECT_EQ(TimeRange(start, TimeRange::Duration(duration)), TimeRange(start, end));
+    EXPECT_EQ(TimeRange(start, TimeRange::Duration(duration)), TimeRange(start, end)) << label;
   }
 }
 
