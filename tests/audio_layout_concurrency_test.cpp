@@ -21,17 +21,13 @@ void RunOnThreads(Body body) {
 // The supported set is built on first use; threads racing to that first use
 // must all see the one complete set.
 TEST(GetSupportedAudioChannelDescriptions, FirstUseFromManyThreadsSeesOneCompleteSet) {
-  std::array<const AudioChannelDescriptionSet*, kThreads> seen{};
-  std::array<std::size_t, kThreads> sizes{};
+  std::array<std::pair<const AudioChannelDescriptionSet*, std::size_t>, kThreads> seen{};
   RunOnThreads([&](std::size_t t) {
-    seen[t] = &GetSupportedAudioChannelDescriptions();
-    sizes[t] = seen[t]->size();
+    const AudioChannelDescriptionSet& set = GetSupportedAudioChannelDescriptions();
+    seen[t] = {&set, set.size()};
   });
-  for (std::size_t t = 0; t < kThreads; ++t) {
-    SCOPED_TRACE(t);
-    EXPECT_EQ(seen[t], seen[0]);
-    EXPECT_EQ(sizes[t], kAudioChannelLabelCount);
-  }
+  for (const auto& each : seen)
+    EXPECT_EQ(each, std::make_pair(seen[0].first, kAudioChannelLabelCount));
 }
 
 TEST(ComputeChannelConversionMatrix, ThreadsSharingTheLayoutsGetTheSameMatrix) {

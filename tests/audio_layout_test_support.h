@@ -34,10 +34,9 @@ constexpr std::uint32_t KnownLabelValue(std::size_t index) {
 inline AudioChannelLabel ParseLabel(std::string_view word) {
   if (word == "?") return kUnknownLabel;
   if (word[0] == '#') return AudioChannelLabel(std::stoul(std::string(word.substr(1))));
-  for (std::size_t k = 0; k < std::size(kAbbreviations); ++k) {
-    if (word == kAbbreviations[k]) return AudioChannelLabel(KnownLabelValue(k));
-  }
-  throw std::invalid_argument("unknown abbreviation " + std::string(word));
+  const auto* found = std::find(std::begin(kAbbreviations), std::end(kAbbreviations), word);
+  if (found == std::end(kAbbreviations)) throw std::invalid_argument(std::string(word));
+  return AudioChannelLabel(KnownLabelValue(static_cast<std::size_t>(found - kAbbreviations)));
 }
 
 inline std::string LabelText(AudioChannelLabel label) {
@@ -59,16 +58,14 @@ inline AudioChannelLayout ParseLayout(std::string_view text) {
 
 inline std::string LayoutText(const AudioChannelLayout& layout) {
   std::string text;
-  for (AudioChannelDescription channel : layout) {
-    text += (text.empty() ? "" : " ") + LabelText(channel.label);
-  }
+  for (AudioChannelDescription c : layout) text += (text.empty() ? "" : " ") + LabelText(c.label);
   return text;
 }
 
 struct NamedLayout {
   const char* name;
   AudioChannelLayout (*create)();
-  const char* order;  // nullptr where the name Create_A_B_..._ChannelLayout spells it
+  const char* order;  // nullptr where the name Create_A_B_..._ChannelLayout spells it (ZMT_SPELLED)
 };
 
 inline std::string PromisedOrder(const NamedLayout& named) {
@@ -81,85 +78,40 @@ inline std::string PromisedOrder(const NamedLayout& named) {
 
 // clang-format off
 #define ZMT_LAYOUT(factory, order) NamedLayout{#factory, &factory, order}
+#define ZMT_SPELLED(order) NamedLayout{"Create_" #order "_ChannelLayout", &Create_##order##_ChannelLayout, nullptr}
 inline const NamedLayout kNamedLayouts[] = {
-    ZMT_LAYOUT(CreateMonoChannelLayout, "*"),
-    ZMT_LAYOUT(CreateStereoChannelLayout, "L R"),
-    ZMT_LAYOUT(CreateMatrixStereoChannelLayout, "Lt Rt"),
-    ZMT_LAYOUT(Create_Ls_Rs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_Lc_Rc_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_Lsd_Rsd_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_C_LFE_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_Vhl_Vhr_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_Tsl_Tsr_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_Tbl_Tbr_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_Bfl_Bfr_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_C_L_R_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_C_R_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_LFE_ChannelLayout, nullptr),
-    ZMT_LAYOUT(CreateQuadraphonicChannelLayout, "L R Ls Rs"),
-    ZMT_LAYOUT(CreateAmbisonicsBFormatChannelLayout, "W X Y Z"),
-    ZMT_LAYOUT(Create_L_R_C_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_C_L_R_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_C_R_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_LFE_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_Cs_LFE_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_LFE_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_C_R_LFE_ChannelLayout, nullptr),
-    ZMT_LAYOUT(CreatePentagonalChannelLayout, "L R Ls Rs C"),
-    ZMT_LAYOUT(Create_L_R_Ls_Rs_C_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_Ls_Rs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_C_R_Ls_Rs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_C_L_R_Ls_Rs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_LFE_Ls_Rs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_LFE_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_C_R_Cs_LFE_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_Ls_Rs_LFE_ChannelLayout, nullptr),
-    ZMT_LAYOUT(CreateBroadcast51ChannelLayout, "L R C LFE Ls Rs"),
-    ZMT_LAYOUT(Create51ChannelLayout, "L R C LFE Ls Rs"),
-    ZMT_LAYOUT(CreateLegacy51ChannelLayout, "L R Ls Rs C LFE"),
-    ZMT_LAYOUT(CreateHexagonalChannelLayout, "L R Ls Rs C Cs"),
-    ZMT_LAYOUT(Create_L_C_R_Ls_Rs_LFE_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_C_L_R_Ls_Rs_LFE_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_C_L_R_Ls_Rs_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_Ls_Rs_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_Ls_Rs_Lsd_Rsd_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_LFE_Ls_Rs_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_LFE_Ls_Rs_Lsd_Rsd_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_Ls_Rs_C_Rls_Rrs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_Ls_Rs_C_Lc_Rc_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_Ls_Rs_Lc_Rc_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_C_L_R_Ls_Rs_Cs_LFE_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_C_L_R_Ls_Rs_Rls_Rrs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_Ls_Rs_Lsd_Rsd_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create7_1ChannelLayout, "L R C LFE Ls Rs Lc Rc"),
-    ZMT_LAYOUT(Create7_1MpegChannelLayout, "C Lc Rc L R Ls Rs LFE"),
+    ZMT_LAYOUT(CreateMonoChannelLayout, "*"), ZMT_LAYOUT(CreateStereoChannelLayout, "L R"),
+    ZMT_LAYOUT(CreateMatrixStereoChannelLayout, "Lt Rt"), ZMT_SPELLED(Ls_Rs), ZMT_SPELLED(Lc_Rc), ZMT_SPELLED(Lsd_Rsd),
+    ZMT_SPELLED(C_LFE), ZMT_SPELLED(Vhl_Vhr), ZMT_SPELLED(Tsl_Tsr), ZMT_SPELLED(Tbl_Tbr), ZMT_SPELLED(Bfl_Bfr), ZMT_SPELLED(L_R_C),
+    ZMT_SPELLED(C_L_R), ZMT_SPELLED(L_C_R), ZMT_SPELLED(L_R_Cs), ZMT_SPELLED(L_R_LFE),
+    ZMT_LAYOUT(CreateQuadraphonicChannelLayout, "L R Ls Rs"), ZMT_LAYOUT(CreateAmbisonicsBFormatChannelLayout, "W X Y Z"),
+    ZMT_SPELLED(L_R_C_Cs), ZMT_SPELLED(C_L_R_Cs), ZMT_SPELLED(L_C_R_Cs), ZMT_SPELLED(L_R_LFE_Cs), ZMT_SPELLED(L_R_Cs_LFE),
+    ZMT_SPELLED(L_R_C_LFE), ZMT_SPELLED(L_C_R_LFE), ZMT_LAYOUT(CreatePentagonalChannelLayout, "L R Ls Rs C"),
+    ZMT_SPELLED(L_R_Ls_Rs_C), ZMT_SPELLED(L_R_C_Ls_Rs), ZMT_SPELLED(L_C_R_Ls_Rs), ZMT_SPELLED(C_L_R_Ls_Rs),
+    ZMT_SPELLED(L_R_LFE_Ls_Rs), ZMT_SPELLED(L_R_C_LFE_Cs), ZMT_SPELLED(L_C_R_Cs_LFE), ZMT_SPELLED(L_R_Ls_Rs_LFE),
+    ZMT_LAYOUT(CreateBroadcast51ChannelLayout, "L R C LFE Ls Rs"), ZMT_LAYOUT(Create51ChannelLayout, "L R C LFE Ls Rs"),
+    ZMT_LAYOUT(CreateLegacy51ChannelLayout, "L R Ls Rs C LFE"), ZMT_LAYOUT(CreateHexagonalChannelLayout, "L R Ls Rs C Cs"),
+    ZMT_SPELLED(L_C_R_Ls_Rs_LFE), ZMT_SPELLED(C_L_R_Ls_Rs_LFE), ZMT_SPELLED(C_L_R_Ls_Rs_Cs), ZMT_SPELLED(L_R_C_Ls_Rs_Cs),
+    ZMT_SPELLED(L_R_Ls_Rs_Lsd_Rsd), ZMT_SPELLED(L_R_C_LFE_Ls_Rs_Cs), ZMT_SPELLED(L_R_LFE_Ls_Rs_Lsd_Rsd),
+    ZMT_SPELLED(L_R_Ls_Rs_C_Rls_Rrs), ZMT_SPELLED(L_R_Ls_Rs_C_Lc_Rc), ZMT_SPELLED(L_R_C_Ls_Rs_Lc_Rc),
+    ZMT_SPELLED(C_L_R_Ls_Rs_Cs_LFE), ZMT_SPELLED(C_L_R_Ls_Rs_Rls_Rrs), ZMT_SPELLED(L_R_C_Ls_Rs_Lsd_Rsd),
+    ZMT_LAYOUT(Create7_1ChannelLayout, "L R C LFE Ls Rs Lc Rc"), ZMT_LAYOUT(Create7_1MpegChannelLayout, "C Lc Rc L R Ls Rs LFE"),
     ZMT_LAYOUT(Create7_1ItuChannelLayout, "L R C LFE Ls Rs Rls Rrs"),
-    ZMT_LAYOUT(Create7_1EMagicChannelLayout, "L R Ls Rs C LFE Lc Rc"),
-    ZMT_LAYOUT(Create_L_R_C_LFE_Ls_Rs_Lsd_Rsd_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_LFE_Ls_Rs_Pl_Pr_ChannelLayout, nullptr),
-    ZMT_LAYOUT(CreateSmpteDtvChannelLayout, "L R C LFE Ls Rs Lt Rt"),
-    ZMT_LAYOUT(CreateOctagonalChannelLayout, "L R Ls Rs C Cs Lsd Rsd"),
-    ZMT_LAYOUT(Create_C_L_R_Ls_Rs_Rls_Rrs_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_Ls_Rs_Lc_Rc_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_Ls_Rs_Cs_Lsd_Rsd_ChannelLayout, nullptr),
+    ZMT_LAYOUT(Create7_1EMagicChannelLayout, "L R Ls Rs C LFE Lc Rc"), ZMT_SPELLED(L_R_C_LFE_Ls_Rs_Lsd_Rsd),
+    ZMT_SPELLED(L_R_C_LFE_Ls_Rs_Pl_Pr), ZMT_LAYOUT(CreateSmpteDtvChannelLayout, "L R C LFE Ls Rs Lt Rt"),
+    ZMT_LAYOUT(CreateOctagonalChannelLayout, "L R Ls Rs C Cs Lsd Rsd"), ZMT_SPELLED(C_L_R_Ls_Rs_Rls_Rrs_Cs),
+    ZMT_SPELLED(L_R_C_Ls_Rs_Lc_Rc_Cs), ZMT_SPELLED(L_R_C_Ls_Rs_Cs_Lsd_Rsd),
     ZMT_LAYOUT(CreateCubeChannelLayout, "L R Ls Rs Vhl Vhr Tbl Tbr"),
     ZMT_LAYOUT(Create_VST_7_1_Cine_Top_Center_Layout, "L R C LFE Ls Rs Cs Ts"),
     ZMT_LAYOUT(Create_VST_7_1_Cine_Center_High_Layout, "L R C LFE Ls Rs Cs Vhc"),
     ZMT_LAYOUT(Create_VST_7_1_Cine_Front_High_Layout, "L R C LFE Ls Rs Vhl Vhr"),
-    ZMT_LAYOUT(Create_VST_7_1_Cine_Side_High_Layout, "L R C LFE Ls Rs Tsl Tsr"),
-    ZMT_LAYOUT(Create_L_R_C_LFE_Ls_Rs_Lc_Rc_Cs_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_LFE_Ls_Rs_Cs_Lsd_Rsd_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_LFE_Ls_Rs_Vhl_Vhc_Vhr_Bfc_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_Ls_Rs_Vhl_Vhr_Tbl_Tbr_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_LFE_Ls_Rs_Vhl_Vhr_Tbl_Tbr_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_LFE_Ls_Rs_Lsd_Rsd_Tsl_Tsr_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_Ls_Rs_Ts_Vhl_Vhr_Tbl_Tbr_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_LFE_Ls_Rs_Ts_Vhl_Vhr_Tbl_Tbr_ChannelLayout, nullptr),
-    ZMT_LAYOUT(Create_L_R_C_Ls_Rs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr_ChannelLayout, nullptr),
+    ZMT_LAYOUT(Create_VST_7_1_Cine_Side_High_Layout, "L R C LFE Ls Rs Tsl Tsr"), ZMT_SPELLED(L_R_C_LFE_Ls_Rs_Lc_Rc_Cs),
+    ZMT_SPELLED(L_R_C_LFE_Ls_Rs_Cs_Lsd_Rsd), ZMT_SPELLED(L_R_LFE_Ls_Rs_Vhl_Vhc_Vhr_Bfc), ZMT_SPELLED(L_R_C_Ls_Rs_Vhl_Vhr_Tbl_Tbr),
+    ZMT_SPELLED(L_R_C_LFE_Ls_Rs_Vhl_Vhr_Tbl_Tbr), ZMT_SPELLED(L_R_C_LFE_Ls_Rs_Lsd_Rsd_Tsl_Tsr),
+    ZMT_SPELLED(L_R_C_Ls_Rs_Ts_Vhl_Vhr_Tbl_Tbr), ZMT_SPELLED(L_R_C_LFE_Ls_Rs_Ts_Vhl_Vhr_Tbl_Tbr),
+    ZMT_SPELLED(L_R_C_Ls_Rs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr),
     ZMT_LAYOUT(CreateVST10_2ChannelLayout, "L R C LFE Ls Rs Vhl Vhc Vhr Tbl Tbr LFE2"),
-    ZMT_LAYOUT(Create_L_R_C_LFE_Ls_Rs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr_ChannelLayout, nullptr),
+    ZMT_SPELLED(L_R_C_LFE_Ls_Rs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr),
     ZMT_LAYOUT(Create_L_R_C_Ls_Rs_Cs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr_ChannelLayout, "L R C Ls Rs Cs Ts Vhl Vhc Vhr Tbl Tbc Tbr"),
     ZMT_LAYOUT(CreateVST10_2_PlusChannelLayout, "L R C LFE Ls Rs Lc Rc Vhl Vhc Vhr Tbl Tbr LFE2"),
     ZMT_LAYOUT(Create_L_R_C_LFE_Ls_Rs_Cs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr_ChannelLayout, "L R C LFE Ls Rs Cs Ts Vhl Vhc Vhr Tbl Tbc Tbr"),
@@ -173,6 +125,7 @@ inline const NamedLayout kNamedLayouts[] = {
 };
 // clang-format on
 #undef ZMT_LAYOUT
+#undef ZMT_SPELLED
 static_assert(std::size(kNamedLayouts) == kNamedAudioChannelLayoutCount);
 
 // Calls check(source, destination) for every ordered pair of named layouts.
