@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 #include <zebmediatypes/audio_descriptions.h>
 
+#include <functional>
 #include <thread>
 #include <vector>
 
@@ -14,18 +15,14 @@ TEST(AudioChannelLayoutDescription, FirstUseFromManyThreadsGivesTheSameTexts) {
                                         CreateSmpteDtvChannelLayout()};
   std::vector<std::vector<zebcore::UTF16String>> texts(8);
   std::vector<std::thread> threads;
-  for (auto& perThread : texts) {
-    threads.emplace_back([&] {
-      for (int i = 0; i < 150; ++i)
-        perThread.push_back(AudioChannelLayoutDescription(layouts[i % 3]));
-    });
-  }
+  const auto describe = [&layouts](std::vector<zebcore::UTF16String>& out) {
+    for (int i = 0; i < 150; ++i) out.push_back(AudioChannelLayoutDescription(layouts[i % 3]));
+  };
+  for (auto& perThread : texts) threads.emplace_back(describe, std::ref(perThread));
   for (std::thread& thread : threads) thread.join();
-  for (const auto& perThread : texts) {
-    ASSERT_EQ(perThread.size(), 150u);
-    for (std::size_t i = 0; i < perThread.size(); ++i)
-      EXPECT_EQ(perThread[i], AudioChannelLayoutDescription(layouts[i % 3]));
-  }
+  std::vector<zebcore::UTF16String> expected;
+  describe(expected);
+  for (const auto& perThread : texts) EXPECT_EQ(perThread, expected);
 }
 
 }  // namespace

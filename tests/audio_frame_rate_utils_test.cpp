@@ -15,10 +15,12 @@ FrameRate Hertz(std::int64_t hz) { return FrameRate(kTicksPerSecond / hz); }
 
 TEST(NativeAudioRates, AreTheNineRatesFastestFirstAndMapToThemselves) {
   const NativeFrameRateSet rates = GetNativeFrameRates();
+  // clang-format off
   const std::vector<FrameRate> expected = {
-      kFrameRate_Audio96000, kFrameRate_Audio88200, kFrameRate_Audio48000,
-      kFrameRate_Audio44100, kFrameRate_Audio32000, kFrameRate_Audio22050,
-      kFrameRate_Audio16000, kFrameRate_Audio11025, kFrameRate_Audio8000};
+      kFrameRate_Audio96000, kFrameRate_Audio88200, kFrameRate_Audio48000, kFrameRate_Audio44100,
+      kFrameRate_Audio32000, kFrameRate_Audio22050, kFrameRate_Audio16000, kFrameRate_Audio11025,
+      kFrameRate_Audio8000};
+  // clang-format on
   EXPECT_EQ(std::vector<FrameRate>(rates.begin(), rates.end()), expected);
   zebcore::debug::ScopedAssertionCapture capture;
   for (FrameRate rate : expected) EXPECT_EQ(FindBestNativeAudioRate(rate), rate);
@@ -26,27 +28,19 @@ TEST(NativeAudioRates, AreTheNineRatesFastestFirstAndMapToThemselves) {
 }
 
 TEST(FindBestNativeAudioRate, PrefersWholeMultiplesThenTheNextRateAbove) {
-  struct Case {
-    std::int64_t hz;
-    FrameRate expected;
-  };
+  // Requested rate and the native rate chosen for it, both in hertz.
   // clang-format off
-  const Case kCases[] = {
-      {100000, kFrameRate_Audio96000}, {176400, kFrameRate_Audio88200}, {192000, kFrameRate_Audio96000},
-      {4000, kFrameRate_Audio8000},    {9000, kFrameRate_Audio11025},   {15000, kFrameRate_Audio16000},
-      {22000, kFrameRate_Audio22050},  {30000, kFrameRate_Audio32000},  {44000, kFrameRate_Audio44100},
-      {47000, kFrameRate_Audio48000},  {88000, kFrameRate_Audio88200},  {88500, kFrameRate_Audio96000},
-      {24000, kFrameRate_Audio48000},  {12000, kFrameRate_Audio48000},  {6000, kFrameRate_Audio48000},
-      {3000, kFrameRate_Audio48000},   {7350, kFrameRate_Audio22050},   {2000, kFrameRate_Audio8000},
-      {1000, kFrameRate_Audio8000},    {500, kFrameRate_Audio8000},     {400, kFrameRate_Audio8000},
-      {14700, kFrameRate_Audio44100},
+  const std::pair<std::int64_t, std::int64_t> kCases[] = {
+      {100000, 96000}, {176400, 88200}, {192000, 96000}, {4000, 8000},   {9000, 11025},
+      {15000, 16000},  {22000, 22050},  {30000, 32000},  {44000, 44100}, {47000, 48000},
+      {88000, 88200},  {88500, 96000},  {24000, 48000},  {12000, 48000}, {6000, 48000},
+      {3000, 48000},   {7350, 22050},   {2000, 8000},    {1000, 8000},   {500, 8000},
+      {400, 8000},     {14700, 44100},
   };
   // clang-format on
   zebcore::debug::ScopedAssertionCapture capture;
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.hz);
-    EXPECT_EQ(FindBestNativeAudioRate(Hertz(c.hz)), c.expected);
-  }
+  for (const auto& [hz, expected] : kCases)
+    EXPECT_EQ(FindBestNativeAudioRate(Hertz(hz)), Hertz(expected)) << hz;
   // Slower than 1 Hz: no whole-hertz multiple to look for.
   EXPECT_EQ(FindBestNativeAudioRate(FrameRate(kTicksPerSecond * 3)), kFrameRate_Audio8000);
   EXPECT_EQ(capture.Count(), 0u);
@@ -54,10 +48,11 @@ TEST(FindBestNativeAudioRate, PrefersWholeMultiplesThenTheNextRateAbove) {
 
 TEST(FindBestNativeAudioRate, RatesOfNoValueAreReportedAndGiveFixedRates) {
   constexpr std::int64_t kMax = std::numeric_limits<std::int64_t>::max();
-  const std::pair<std::int64_t, FrameRate> kCases[] = {{kMax, kFrameRate_Audio8000},
-                                                       {0, kFrameRate_Audio96000},
-                                                       {-1, kFrameRate_Audio96000},
-                                                       {-kMax - 1, kFrameRate_Audio96000}};
+  // clang-format off
+  const std::pair<std::int64_t, FrameRate> kCases[] = {
+      {kMax, kFrameRate_Audio8000}, {0, kFrameRate_Audio96000}, {-1, kFrameRate_Audio96000},
+      {-kMax - 1, kFrameRate_Audio96000}};
+  // clang-format on
   for (const auto& [ticks, expected] : kCases) {
     SCOPED_TRACE(ticks);
     zebcore::debug::ScopedAssertionCapture capture;

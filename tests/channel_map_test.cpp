@@ -10,55 +10,53 @@ namespace zebmediatypes {
 namespace {
 
 using L = AudioChannelLabel;
+using Channel = std::pair<AudioChannelLayout, int>;  // a channel's labels and its mapping
 constexpr int kIntMin = std::numeric_limits<int>::min();
 constexpr int kIntMax = std::numeric_limits<int>::max();
 
-// Each channel's labels and mapping, in channel order.
-std::vector<std::pair<AudioChannelLayout, int>> Channels(const ChannelMap& map) {
-  std::vector<std::pair<AudioChannelLayout, int>> channels;
+std::vector<Channel> Channels(const ChannelMap& map) {
+  std::vector<Channel> channels;
   for (int k = 0; k < map.GetNumberOfChannels(); ++k)
     channels.emplace_back(map.GetChannelLayout(k), map[k]);
   return channels;
 }
 
+ChannelMap MapOf(const std::vector<Channel>& channels) {
+  ChannelMap map;
+  for (const auto& [labels, mapping] : channels) map.AddChannel(labels, mapping);
+  return map;
+}
+
 TEST(ChannelMap, CreateDefaultChannelMapRoutesEachChannelToItself) {
-  struct Case {
-    int count;
-    std::vector<AudioChannelLabel> labels;
-  };
   // clang-format off
-  const Case kCases[] = {
-      {-3, {}},
-      {0, {}},
-      {1, {L::Discrete}},
-      {2, {L::FrontLeft, L::FrontRight}},
+  const std::pair<int, std::vector<AudioChannelLabel>> kCases[] = {
+      {-3, {}}, {0, {}}, {1, {L::Discrete}}, {2, {L::FrontLeft, L::FrontRight}},
       {4, {L::FrontLeft, L::FrontRight, L::FrontCenter, L::LowFrequency}},
       {6, {L::FrontLeft, L::FrontRight, L::FrontCenter, L::LowFrequency, L::BackLeft, L::BackRight}},
-      {9, {L::FrontLeft, L::FrontRight, L::FrontCenter, L::LowFrequency, L::BackLeft, L::BackRight, L::FrontLeftOfCenter, L::FrontRightOfCenter, L::BackCenter}},
   };
   // clang-format on
-  for (const Case& c : kCases) {
-    SCOPED_TRACE(c.count);
-    std::vector<std::pair<AudioChannelLayout, int>> expected;
-    for (AudioChannelLabel label : c.labels)
+  for (const auto& [count, labels] : kCases) {
+    SCOPED_TRACE(count);
+    std::vector<Channel> expected;
+    for (AudioChannelLabel label : labels)
       expected.emplace_back(AudioChannelLayout{label}, static_cast<int>(expected.size()));
-    const ChannelMap map = ChannelMap::CreateDefaultChannelMap(c.count);
+    const ChannelMap map = ChannelMap::CreateDefaultChannelMap(count);
     EXPECT_EQ(Channels(map), expected);
     EXPECT_EQ(map.GetNumberOfAssignments(), map.GetNumberOfChannels());
   }
 }
 
 TEST(ChannelMap, ChannelsBeyondTheDefaultOrderCarryTheUnknownLabel) {
-  const ChannelMap map(40);
-  std::vector<std::pair<AudioChannelLayout, int>> expected;
-  for (int k = 0; k < 40; ++k)
-    expected.emplace_back(AudioChannelLayout{GetChannelMapDefaultLabel(k)}, -1);
-  EXPECT_EQ(Channels(map), expected);
-  EXPECT_EQ(expected[12].first, AudioChannelLayout{L::TopFrontLeft});
-  EXPECT_EQ(expected[35].first, AudioChannelLayout{L::ProximityRight});
-  EXPECT_EQ(expected[36].first, AudioChannelLayout{kChannelMapUnknownLabel});
-  EXPECT_EQ(map.GetNumberOfAssignments(), 0);
-  EXPECT_EQ(map.Find(0), -1);
+  const std::vector<Channel> channels = Channels(ChannelMap(40));
+  ASSERT_EQ(channels.size(), 40u);
+  // clang-format off
+  const std::pair<int, AudioChannelLabel> kCases[] = {
+      {0, L::FrontLeft}, {6, L::FrontLeftOfCenter}, {8, L::BackCenter}, {12, L::TopFrontLeft},
+      {35, L::ProximityRight}, {36, kChannelMapUnknownLabel}, {39, kChannelMapUnknownLabel}};
+  // clang-format on
+  for (const auto& [k, label] : kCases)
+    EXPECT_EQ(channels[static_cast<std::size_t>(k)], Channel({label}, -1)) << k;
+  EXPECT_EQ(ChannelMap(40).GetNumberOfAssignments(), 0);
 }
 
 TEST(ChannelMap, HugeChannelCountIsReportedAndClamped) {
@@ -87,45 +85,35 @@ TEST(ChannelMap, InvalidIndexesGiveNeutralResults) {
               kSourceChannelIndex_OutOfRange);
   EXPECT_EQ(map.GetSourceChannelIndexForChannelLabelIndex(1), 1);
   EXPECT_EQ(map.GetSourceChannelIndexForChannelLabelIndex(2), kSourceChannelIndex_NoMatch);
-  EXPECT_EQ(GetChannelMapDefaultLabel(36), kChannelMapUnknownLabel);
   EXPECT_EQ(GetChannelMapDefaultLabel(-1), kChannelMapUnknownLabel);
 }
 
 TEST(ChannelMap, SourceIndexIsTheMappingOfTheFirstChannelCarryingTheLabel) {
-  ChannelMap map = ChannelMap::CreateDefaultChannelMap(2);
-  EXPECT_EQ(map.GetSourceChannelIndexForChannelLabel(L::FrontCenter), -1);
-  EXPECT_EQ(map.GetSourceChannelIndexForChannelLabel(kChannelMapUnknownLabel), -1);
-  map.SetChannel(1, -1);
-  map.AddChannel({L::FrontRight}, 4);  // a later channel does not win
+  // A later channel carrying the label does not win.
+  const ChannelMap map = MapOf({{{L::FrontLeft}, 0}, {{L::FrontRight}, -1}, {{L::FrontRight}, 4}});
   EXPECT_EQ(map.GetSourceChannelIndexForChannelLabel(L::FrontRight), -1);
+  EXPECT_EQ(map.GetSourceChannelIndexForChannelLabel(kChannelMapUnknownLabel), -1);
   EXPECT_EQ(map.Find(4), 2);
 }
 
 TEST(ChannelMap, NumberOfAssignmentsCountsTheLabelsOfEachRoutedChannel) {
-  ChannelMap crossed;  // two labels routed to 1, then one label unrouted
-  crossed.AddChannel({L::FrontLeft, L::FrontRight}, 1);
-  crossed.AddChannel({L::FrontCenter}, -1);
-  EXPECT_EQ(crossed.GetNumberOfAssignments(), 2);
-  ChannelMap far;  // routed beyond the map's own channel count is still routed
-  far.AddChannel({L::FrontLeft}, 5);
-  EXPECT_EQ(far.GetNumberOfAssignments(), 1);
-  ChannelMap swapped = ChannelMap::CreateDefaultChannelMap(2);
-  swapped.SetChannelLayout(0, {L::FrontLeft, L::BackLeft});
-  swapped.SetChannel(0, 1);
-  swapped.SetChannel(1, 0);
-  EXPECT_EQ(swapped.GetNumberOfAssignments(), 3);
+  // Two labels routed to channel 1 and one label unrouted; a mapping beyond the
+  // map's own channel count is still routed.
+  EXPECT_EQ(
+      MapOf({{{L::FrontLeft, L::FrontRight}, 1}, {{L::FrontCenter}, -1}}).GetNumberOfAssignments(),
+      2);
+  EXPECT_EQ(MapOf({{{L::FrontLeft}, 5}}).GetNumberOfAssignments(), 1);
   EXPECT_EQ(ChannelMap(3).GetNumberOfAssignments(), 0);
 }
 
 TEST(ChannelMap, SetDeviceChannelIndexMovesTheLabel) {
-  using Channel = std::pair<AudioChannelLayout, int>;
+  // At 0 its own channel goes away first, so the label comes back as a new last channel.
+  // clang-format off
   const std::pair<int, std::vector<Channel>> kCases[] = {
-      {1, {{{L::FrontRight, L::FrontLeft}, 1}}},
-      {5, {{{L::FrontRight}, 1}, {{L::FrontLeft}, 5}}},
-      {-1, {{{L::FrontRight}, 1}}},
-      // Its own channel goes away first, so the label comes back as a new last channel.
-      {0, {{{L::FrontRight}, 1}, {{L::FrontLeft}, 0}}},
+      {1, {{{L::FrontRight, L::FrontLeft}, 1}}},        {-1, {{{L::FrontRight}, 1}}},
+      {5, {{{L::FrontRight}, 1}, {{L::FrontLeft}, 5}}}, {0, {{{L::FrontRight}, 1}, {{L::FrontLeft}, 0}}},
   };
+  // clang-format on
   for (const auto& [deviceIndex, expected] : kCases) {
     SCOPED_TRACE(deviceIndex);
     ChannelMap map = ChannelMap::CreateDefaultChannelMap(2);
@@ -149,11 +137,9 @@ TEST(ChannelMap, EveryDefaultLabelCanBeRoutedAnywhereAndFoundAgain) {
 }
 
 TEST(ChannelMap, EqualityComparesLabelsAndMappings) {
-  ChannelMap b(AudioChannelLayout{L::BackLeft, L::BackRight});
-  b.SetChannel(0, 0);
-  b.SetChannel(1, 1);
-  EXPECT_TRUE(ChannelMap::CreateDefaultChannelMap(2).IsMappingEqual(b));
-  EXPECT_NE(ChannelMap::CreateDefaultChannelMap(2), b);
+  const ChannelMap back = MapOf({{{L::BackLeft}, 0}, {{L::BackRight}, 1}});
+  EXPECT_TRUE(ChannelMap::CreateDefaultChannelMap(2).IsMappingEqual(back));
+  EXPECT_NE(ChannelMap::CreateDefaultChannelMap(2), back);
 }
 
 }  // namespace
