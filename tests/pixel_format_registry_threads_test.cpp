@@ -9,8 +9,9 @@
 namespace zebmediatypes {
 namespace {
 
-constexpr int kThreads = 8;
-constexpr int kNamesPerThread = 200;
+constexpr int kThreads = 8, kNamesPerThread = 200;
+constexpr PixelFormat kBGRA = kPixelFormat_BGRA_4444_8u;
+constexpr PixelFormatProperties kShared(0x7777);  // a word every thread registers
 
 PixelFormatName CustomName(int thread, int index) {
   return MakePixelFormatName('_', static_cast<char>('a' + thread), static_cast<char>(index / 16),
@@ -26,28 +27,22 @@ TEST(CustomPixelFormatRegistry, ConcurrentRegistrationsAreAllKept) {
         const PixelFormatName name = CustomName(t, i);
         const PixelFormatProperties word(static_cast<std::uint32_t>(t * 1000 + i + 1));
         RegisterCustomPixelFormatProperties(name, word);
-        if (LookupPropertiesForName(name) != word) ++mismatches;
+        mismatches += LookupPropertiesForName(name) != word;
         // A word shared by every thread: the smallest name must come back.
-        RegisterCustomPixelFormatProperties(CustomName(t, 255), PixelFormatProperties(0x7777));
-        const unsigned int found = FindCustomPixelFormatByProperties(PixelFormatProperties(0x7777));
-        if (!IsCustomPixelFormatName(found)) ++mismatches;
+        RegisterCustomPixelFormatProperties(CustomName(t, 255), kShared);
+        mismatches += !IsCustomPixelFormatName(FindCustomPixelFormatByProperties(kShared));
         // Built-in lookups take no lock and still work alongside.
-        if (LookupPropertiesForName(kPixelFormat_BGRA_4444_8u.fourCC) !=
-            kPixelFormat_BGRA_4444_8u.properties) {
-          ++mismatches;
-        }
+        mismatches += LookupPropertiesForName(kBGRA.fourCC) != kBGRA.properties;
       }
     });
   }
   for (std::thread& t : threads) t.join();
   EXPECT_EQ(mismatches.load(), 0);
   for (int t = 0; t < kThreads; ++t) {
-    for (int i = 0; i < kNamesPerThread; ++i) {
-      ASSERT_EQ(LookupPropertiesForName(CustomName(t, i)).Word(),
-                static_cast<std::uint32_t>(t * 1000 + i + 1));
-    }
+    for (int i = 0; i < kNamesPerThread; ++i)
+      ASSERT_EQ(LookupPropertiesForName(CustomName(t, i)).Word(), unsigned(t * 1000 + i + 1));
   }
-  EXPECT_EQ(FindCustomPixelFormatByProperties(PixelFormatProperties(0x7777)), CustomName(0, 255));
+  EXPECT_EQ(FindCustomPixelFormatByProperties(kShared), CustomName(0, 255));
 }
 
 }  // namespace
