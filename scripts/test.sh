@@ -3,7 +3,7 @@
 #   1. installs the Debian packages (scripts/install-deps.sh);
 #   2. clang build with AddressSanitizer + UndefinedBehaviorSanitizer and
 #      libFuzzer instrumentation, warnings as errors: every unit test, then each
-#      fuzz target for a short, bounded time (ZMT_FUZZ_SECONDS, default 20);
+#      fuzz target for a short, bounded time (ZMT_FUZZ_SECONDS, default 30);
 #   3. g++ ThreadSanitizer build: the tests that exercise shared state;
 #   4. g++ optimized build, warnings as errors: the exhaustive sweeps, the
 #      benchmarks built (not run), the tools, install, and the consumer project
@@ -14,7 +14,7 @@ cd "$(dirname "$0")/.."
 root=$(pwd)
 out=${ZMT_BUILD_ROOT:-$root/build}
 jobs=${ZMT_JOBS:-$(nproc)}
-fuzz_seconds=${ZMT_FUZZ_SECONDS:-20}
+fuzz_seconds=${ZMT_FUZZ_SECONDS:-30}
 
 bash scripts/install-deps.sh
 
