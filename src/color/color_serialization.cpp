@@ -241,6 +241,20 @@ UTF8String WriteColorSpace(const color::ColorSpace& space) {
   return zebcore::serialization::GetJSONUTF8String(object, false);
 }
 
+// Holds the colour lock for a scope. A wait that runs out is reported for
+// `function`; the caller then skips its work and returns its empty result.
+class ColorLockGuard {
+ public:
+  ColorLockGuard(const char* function, int line)
+      : guard_(State().lock, nullptr, details::LockWaitMilliseconds()) {
+    if (!guard_) details::ReportLockTimeout("colour lock", function, line);
+  }
+  explicit operator bool() const noexcept { return guard_.Held(); }
+
+ private:
+  zebcore::threads::RecursiveLockGuard guard_;
+};
+
 }  // namespace
 
 // ---------------------------------------------------------------------------
@@ -266,11 +280,8 @@ void ReportLockTimeout(const char* lockName, const char* function, int line) noe
 bool InstallDefaultColorSpace(const color::ColorSpace& space) noexcept {
   try {
     ColorState& state = State();
-    zebcore::threads::RecursiveLockGuard guard(state.lock, nullptr, LockWaitMilliseconds());
-    if (!guard) {
-      ReportLockTimeout("colour lock", "zebmediatypes::color::SetDefaultColorSpace", __LINE__);
-      return false;
-    }
+    const ColorLockGuard guard("zebmediatypes::color::SetDefaultColorSpace", __LINE__);
+    if (!guard) return false;
     state.defaultSpace = space;
     color::AddColorSpaceToCache(space);  // cannot time out: the lock is held already
     return true;
@@ -281,11 +292,8 @@ bool InstallDefaultColorSpace(const color::ColorSpace& space) noexcept {
 
 bool ClearColorSpaceCache() noexcept {
   ColorState& state = State();
-  zebcore::threads::RecursiveLockGuard guard(state.lock, nullptr, LockWaitMilliseconds());
-  if (!guard) {
-    ReportLockTimeout("colour lock", "zebmediatypes::Terminate", __LINE__);
-    return false;
-  }
+  const ColorLockGuard guard("zebmediatypes::Terminate", __LINE__);
+  if (!guard) return false;
   state.cache.clear();
   return true;
 }
@@ -383,12 +391,8 @@ ColorManagementSettings ColorManagementSettingsFromSerializedString(
 
 Guid AddColorSpaceToCache(const ColorSpace& space) {
   ColorState& state = State();
-  zebcore::threads::RecursiveLockGuard guard(state.lock, nullptr, details::LockWaitMilliseconds());
-  if (!guard) {
-    details::ReportLockTimeout("colour lock", "zebmediatypes::color::AddColorSpaceToCache",
-                               __LINE__);
-    return Guid();
-  }
+  const ColorLockGuard guard("zebmediatypes::color::AddColorSpaceToCache", __LINE__);
+  if (!guard) return Guid();
   const Guid id = space.ToGuid();
   state.cache.try_emplace(id, space);
   return id;
@@ -397,24 +401,16 @@ Guid AddColorSpaceToCache(const ColorSpace& space) {
 ColorSpace RetrieveColorSpaceFromCache(const Guid& id) {
   if (id.IsNull()) return ColorSpace();
   ColorState& state = State();
-  zebcore::threads::RecursiveLockGuard guard(state.lock, nullptr, details::LockWaitMilliseconds());
-  if (!guard) {
-    details::ReportLockTimeout("colour lock", "zebmediatypes::color::RetrieveColorSpaceFromCache",
-                               __LINE__);
-    return ColorSpace();
-  }
+  const ColorLockGuard guard("zebmediatypes::color::RetrieveColorSpaceFromCache", __LINE__);
+  if (!guard) return ColorSpace();
   const auto it = state.cache.find(id);
   return it == state.cache.end() ? ColorSpace() : it->second;
 }
 
 ColorSpace GetDefaultColorSpace() {
   ColorState& state = State();
-  zebcore::threads::RecursiveLockGuard guard(state.lock, nullptr, details::LockWaitMilliseconds());
-  if (!guard) {
-    details::ReportLockTimeout("colour lock", "zebmediatypes::color::GetDefaultColorSpace",
-                               __LINE__);
-    return ColorSpace();
-  }
+  const ColorLockGuard guard("zebmediatypes::color::GetDefaultColorSpace", __LINE__);
+  if (!guard) return ColorSpace();
   return state.cache.empty() ? ColorSpace() : state.defaultSpace;
 }
 

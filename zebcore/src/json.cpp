@@ -109,6 +109,28 @@ class ValueBuilder final : public nlohmann::json_sax<nlohmann::json> {
 
 constexpr char kHex[] = "0123456789abcdef";
 
+// The letter after '\\' for characters JSON escapes by name; 0 for the others.
+constexpr char NamedEscape(unsigned char c) noexcept {
+  switch (c) {
+    case '"':
+      return '"';
+    case '\\':
+      return '\\';
+    case '\b':
+      return 'b';
+    case '\f':
+      return 'f';
+    case '\n':
+      return 'n';
+    case '\r':
+      return 'r';
+    case '\t':
+      return 't';
+    default:
+      return 0;
+  }
+}
+
 void AppendString(UTF8String& out, const unsigned char* p, std::size_t n) {
   out.push_back('"');
   std::size_t i = 0;
@@ -125,40 +147,19 @@ void AppendString(UTF8String& out, const unsigned char* p, std::size_t n) {
       i += r.length;
       continue;
     }
-    switch (c) {
-      case '"':
-        out.append(reinterpret_cast<const unsigned char*>("\\\""), 2);
-        break;
-      case '\\':
-        out.append(reinterpret_cast<const unsigned char*>("\\\\"), 2);
-        break;
-      case '\b':
-        out.append(reinterpret_cast<const unsigned char*>("\\b"), 2);
-        break;
-      case '\f':
-        out.append(reinterpret_cast<const unsigned char*>("\\f"), 2);
-        break;
-      case '\n':
-        out.append(reinterpret_cast<const unsigned char*>("\\n"), 2);
-        break;
-      case '\r':
-        out.append(reinterpret_cast<const unsigned char*>("\\r"), 2);
-        break;
-      case '\t':
-        out.append(reinterpret_cast<const unsigned char*>("\\t"), 2);
-        break;
-      default:
-        if (c < 0x20) {
-          const unsigned char escape[6] = {'\\',
-                                           'u',
-                                           '0',
-                                           '0',
-                                           static_cast<unsigned char>(kHex[c >> 4]),
-                                           static_cast<unsigned char>(kHex[c & 0xF])};
-          out.append(escape, 6);
-        } else {
-          out.push_back(c);
-        }
+    if (const char named = NamedEscape(c)) {
+      const unsigned char escape[2] = {'\\', static_cast<unsigned char>(named)};
+      out.append(escape, 2);
+    } else if (c < 0x20) {
+      const unsigned char escape[6] = {'\\',
+                                       'u',
+                                       '0',
+                                       '0',
+                                       static_cast<unsigned char>(kHex[c >> 4]),
+                                       static_cast<unsigned char>(kHex[c & 0xF])};
+      out.append(escape, 6);
+    } else {
+      out.push_back(c);
     }
     ++i;
   }
