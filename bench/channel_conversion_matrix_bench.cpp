@@ -1,5 +1,7 @@
-// ComputeChannelConversionMatrix against libswresample's matrix builder, side
-// by side in one run. Prints, for each conversion, both times and the ratio.
+// ComputeChannelConversionMatrix and ComputeDownmixMatrix against libswresample's
+// matrix builder, side by side in one run. Prints, for each conversion, both
+// times and the ratio. The peer always builds its down-mix; ours is a down-mix
+// where the layouts allow one and the routing matrix otherwise (stereo->5.1).
 #include <benchmark/benchmark.h>
 #include <zebmediatypes/channel_conversion_matrix.h>
 
@@ -36,6 +38,8 @@ const Conversion kConversions[] = {
      AV_CH_LAYOUT_7POINT1, AV_CH_LAYOUT_5POINT1_BACK},
     {"stereo->5.1", &zebmediatypes::CreateStereoChannelLayout,
      &zebmediatypes::Create51ChannelLayout, AV_CH_LAYOUT_STEREO, AV_CH_LAYOUT_5POINT1_BACK},
+    {"7.1->stereo", &zebmediatypes::Create_L_R_C_LFE_Ls_Rs_Lsd_Rsd_ChannelLayout,
+     &zebmediatypes::CreateStereoChannelLayout, AV_CH_LAYOUT_7POINT1, AV_CH_LAYOUT_STEREO},
 };
 
 // The caller keeps its matrix from call to call, as a mixer does.
@@ -60,6 +64,20 @@ void OursFresh(benchmark::State& state, const Conversion& conversion) {
   for (auto _ : state) {
     ChannelConversionMatrix matrix;
     zebmediatypes::ComputeChannelConversionMatrix(source, destination, matrix);
+    benchmark::DoNotOptimize(matrix.data());
+    benchmark::ClobberMemory();
+  }
+  state.counters["allocs/iter"] = zmt::bench::AllocationsPerIteration(state, before);
+}
+
+// The down-mix, into a matrix kept from call to call.
+void OursDownmix(benchmark::State& state, const Conversion& conversion) {
+  const AudioChannelLayout source = conversion.source();
+  const AudioChannelLayout destination = conversion.destination();
+  ChannelConversionMatrix matrix;
+  const auto before = zmt::bench::AllocationCount();
+  for (auto _ : state) {
+    zebmediatypes::ComputeDownmixMatrix(source, destination, matrix);
     benchmark::DoNotOptimize(matrix.data());
     benchmark::ClobberMemory();
   }
@@ -112,6 +130,8 @@ int main(int argc, char** argv) {
     benchmark::RegisterBenchmark(("ConversionMatrix/ours/" + name).c_str(), Ours, conversion);
     benchmark::RegisterBenchmark(("ConversionMatrix/ours-new-matrix/" + name).c_str(), OursFresh,
                                  conversion);
+    benchmark::RegisterBenchmark(("ConversionMatrix/ours-downmix/" + name).c_str(), OursDownmix,
+                                 conversion);
     benchmark::RegisterBenchmark(("ConversionMatrix/peer/" + name).c_str(), Peer, conversion);
   }
   benchmark::Initialize(&argc, argv);
@@ -120,11 +140,13 @@ int main(int argc, char** argv) {
   benchmark::RunSpecifiedBenchmarks(&reporter);
   benchmark::Shutdown();
 
-  std::printf("\nComputeChannelConversionMatrix against swr_build_matrix2 (same run):\n");
+  std::printf(
+      "\nComputeChannelConversionMatrix (ours, ours-new-matrix) and ComputeDownmixMatrix "
+      "(ours-downmix) against swr_build_matrix2 (same run):\n");
   for (const Conversion& conversion : kConversions) {
     const std::string name = conversion.name;
     const double peer = reporter.TimeOf("ConversionMatrix/peer/" + name);
-    for (const char* variant : {"ours", "ours-new-matrix"}) {
+    for (const char* variant : {"ours", "ours-new-matrix", "ours-downmix"}) {
       const double ours = reporter.TimeOf(std::string("ConversionMatrix/") + variant + "/" + name);
       if (std::isnan(ours) || std::isnan(peer)) continue;
       std::printf("  %-12s %-16s ours %8.1f ns, peer %8.1f ns, ratio %6.1fx\n", name.c_str(),

@@ -1,7 +1,10 @@
-// The channel conversion matrix and its speaker grid.
+// The channel conversion matrix and its speaker grid, and the down-mix.
 #include <zebmediatypes/channel_conversion_matrix.h>
 
 #include <algorithm>
+#include <array>
+#include <cmath>
+#include <initializer_list>
 #include <iterator>
 #include <limits>
 #include <utility>
@@ -188,6 +191,212 @@ void ReplaceResult(ChannelConversionMatrix& result, std::size_t rows, std::size_
   result.swap(fresh);
 }
 
+// The down-mix works on the speakers that have a standard fold. Each pair is
+// left member then right member, so a pair is named by its left speaker.
+enum Speaker : std::size_t {
+  kL,
+  kR,
+  kC,
+  kLfe,
+  kLs,
+  kRs,
+  kCs,
+  kLc,
+  kRc,
+  kLsd,
+  kRsd,
+  kRls,
+  kRrs,
+  kSpeakerCount
+};
+
+constexpr Speaker SpeakerOf(Label label) noexcept {
+  switch (label) {
+    case Label::FrontLeft:
+      return kL;
+    case Label::FrontRight:
+      return kR;
+    case Label::FrontCenter:
+      return kC;
+    case Label::LowFrequency:
+      return kLfe;
+    case Label::BackLeft:
+      return kLs;
+    case Label::BackRight:
+      return kRs;
+    case Label::BackCenter:
+      return kCs;
+    case Label::FrontLeftOfCenter:
+      return kLc;
+    case Label::FrontRightOfCenter:
+      return kRc;
+    case Label::SideLeft:
+      return kLsd;
+    case Label::SideRight:
+      return kRsd;
+    case Label::RearSurroundLeft:
+      return kRls;
+    case Label::RearSurroundRight:
+      return kRrs;
+    default:
+      return kSpeakerCount;
+  }
+}
+
+constexpr bool IsLeft(Speaker s) noexcept {
+  return s == kL || s == kLs || s == kLc || s == kLsd || s == kRls;
+}
+constexpr bool IsRight(Speaker s) noexcept {
+  return s == kR || s == kRs || s == kRc || s == kRsd || s == kRrs;
+}
+
+// Where each speaker sits in a layout (kNone when absent).
+class SpeakerMap {
+ public:
+  // False when the layout has a channel without a standard fold, a repeated
+  // label or a left speaker without its right partner (or the reverse).
+  bool Build(const AudioChannelLayout& layout) noexcept {
+    index_.fill(kNone);
+    if (layout.size() == 1 && layout[0].label == Label::Discrete) {
+      index_[kC] = 0;  // mono
+      return true;
+    }
+    for (std::size_t i = 0; i < layout.size(); ++i) {
+      const Speaker s = SpeakerOf(layout[i].label);
+      if (s == kSpeakerCount || index_[s] != kNone) return false;
+      index_[s] = i;
+    }
+    for (std::size_t s = 0; s < kSpeakerCount; ++s) {
+      if (IsLeft(Speaker(s)) && Has(Speaker(s)) != Has(Speaker(s + 1))) return false;
+    }
+    return true;
+  }
+  bool Has(Speaker s) const noexcept { return index_[s] != kNone; }
+  std::size_t operator[](std::size_t s) const noexcept { return index_[s]; }
+
+ private:
+  std::array<std::size_t, kSpeakerCount> index_{};
+};
+
+constexpr double kMinus3dB = 0.7071067811865476;
+constexpr double kSqrt2 = 1.4142135623730951;
+
+double Level(double level) noexcept { return std::isfinite(level) ? level : 0.0; }
+
+// The down-mix gains by speaker, [destination][source].
+class DownmixGains {
+ public:
+  DownmixGains(const SpeakerMap& source, const SpeakerMap& destination,
+               const DownmixLevels& levels) noexcept
+      : from_(source), to_(destination) {
+    const double center = Level(levels.center);
+    const double surround = Level(levels.surround);
+    const double lfe = Level(levels.lfe);
+    for (std::size_t k = 0; k < kSpeakerCount; ++k) {
+      if (from_.Has(Speaker(k)) && to_.Has(Speaker(k))) gains_[k][k] = 1.0;
+    }
+    for (std::size_t k = 0; k < kSpeakerCount; ++k) {
+      const auto s = Speaker(k);
+      if (!from_.Has(s) || to_.Has(s)) continue;
+      switch (s) {
+        case kC:
+          Add(kL, s, from_.Has(kL) ? center : kMinus3dB);
+          break;
+        case kL:
+        case kR:
+          Add(kC, s, kMinus3dB);
+          if (from_.Has(kC)) gains_[kC][kC] = center * kSqrt2;
+          break;
+        case kLc:
+        case kRc:
+          if (to_.Has(kL)) {
+            Add(kL, s, 1.0);
+          } else {
+            Add(kC, s, kMinus3dB);
+          }
+          break;
+        case kCs:
+          if (!AddToFirst({kLs, kLsd}, s, kMinus3dB)) Front(s, surround * kMinus3dB, surround);
+          break;
+        case kLs:
+        case kRs:
+          if (to_.Has(kCs)) {
+            Add(kCs, s, kMinus3dB);
+          } else if (!AddToFirst({kLsd}, s, from_.Has(kLsd) ? kMinus3dB : 1.0)) {
+            Front(s, surround, surround);
+          }
+          break;
+        case kLsd:
+        case kRsd:
+          if (to_.Has(kLs)) {
+            Add(kLs, s, from_.Has(kLs) ? kMinus3dB : 1.0);
+          } else if (!AddToFirst({kCs}, s, kMinus3dB)) {
+            Front(s, surround, surround);
+          }
+          break;
+        case kRls:
+        case kRrs: {
+          const double gain = from_.Has(kLs) || from_.Has(kLsd) ? kMinus3dB : 1.0;
+          if (!AddToFirst({kLs}, s, gain) && !AddToFirst({kCs}, s, kMinus3dB) &&
+              !AddToFirst({kLsd}, s, gain)) {
+            Front(s, surround, surround);
+          }
+          break;
+        }
+        case kLfe:
+          if (to_.Has(kC)) {
+            Add(kC, s, lfe);
+          } else {
+            Add(kL, s, lfe * kMinus3dB);
+          }
+          break;
+        case kSpeakerCount:
+          break;
+      }
+    }
+  }
+
+  double operator()(std::size_t destination, std::size_t source) const noexcept {
+    return gains_[destination][source];
+  }
+
+ private:
+  // Into `target`, a pair named by its left speaker or a single speaker.
+  void Add(Speaker target, Speaker s, double gain) noexcept {
+    if (!IsLeft(target)) {
+      gains_[target][s] += gain;
+      return;
+    }
+    if (!IsRight(s)) gains_[target][s] += gain;
+    if (!IsLeft(s)) gains_[target + 1][s] += gain;
+  }
+
+  // Into the first of `targets` the destination has; false when it has none.
+  bool AddToFirst(std::initializer_list<Speaker> targets, Speaker s, double gain) noexcept {
+    for (Speaker target : targets) {
+      if (to_.Has(target)) {
+        Add(target, s, gain);
+        return true;
+      }
+    }
+    return false;
+  }
+
+  // Into the front: the pair when the destination has it, else the centre at
+  // -3 dB more.
+  void Front(Speaker s, double pairGain, double centreGain) noexcept {
+    if (to_.Has(kL)) {
+      Add(kL, s, pairGain);
+    } else {
+      Add(kC, s, centreGain * kMinus3dB);
+    }
+  }
+
+  const SpeakerMap& from_;
+  const SpeakerMap& to_;
+  std::array<std::array<double, kSpeakerCount>, kSpeakerCount> gains_{};
+};
+
 }  // namespace
 
 void CreateIdentityChannelConversionMatrix(std::size_t sourceCount, std::size_t destinationCount,
@@ -209,6 +418,36 @@ void ComputeChannelConversionMatrix(const AudioChannelLayout& source,
       const Label target = destination[j].label;
       discreteOrdinal += target == Label::Discrete;
       RouteChannel(source, destination.size(), target, discreteOrdinal, matrix[j]);
+    }
+  });
+}
+
+void ComputeDownmixMatrix(const AudioChannelLayout& source, const AudioChannelLayout& destination,
+                          ChannelConversionMatrix& result, const DownmixLevels& levels) {
+  SpeakerMap from;
+  SpeakerMap to;
+  if (destination.empty() || destination.size() > source.size() || !from.Build(source) ||
+      !to.Build(destination) || !(to.Has(kL) || to.Has(kC))) {
+    ComputeChannelConversionMatrix(source, destination, result);
+    return;
+  }
+  const DownmixGains gains(from, to, levels);
+  ReplaceResult(result, destination.size(), source.size(), [&](ChannelConversionMatrix& matrix) {
+    double largest = 0.0;
+    for (std::size_t d = 0; d < kSpeakerCount; ++d) {
+      if (!to.Has(Speaker(d))) continue;
+      ChannelConversionMatrixRow& row = matrix[to[d]];
+      double sum = 0.0;
+      for (std::size_t s = 0; s < kSpeakerCount; ++s) {
+        if (!from.Has(Speaker(s))) continue;
+        row[from[s]] = gains(d, s);
+        sum += std::fabs(gains(d, s));
+      }
+      largest = std::max(largest, sum);
+    }
+    if (!levels.normalize || !(largest > 1.0)) return;
+    for (ChannelConversionMatrixRow& row : matrix) {
+      for (double& gain : row) gain /= largest;
     }
   });
 }

@@ -19,3 +19,11 @@ zmt_add_test(audio_descriptions_concurrency_tests SOURCES
   audio_descriptions_concurrency_test.cpp
   CONCURRENT
 )
+
+# The down-mix, checked against libswresample's matrix builder.
+find_package(PkgConfig REQUIRED)
+pkg_check_modules(SWRESAMPLE REQUIRED IMPORTED_TARGET libswresample libavutil)
+zmt_add_test(audio_downmix_tests SOURCES downmix_matrix_test.cpp)
+if(TARGET audio_downmix_tests)
+  target_link_libraries(audio_downmix_tests PRIVATE PkgConfig::SWRESAMPLE)
+endif()
