@@ -210,6 +210,9 @@ enum Speaker : std::size_t {
   kSpeakerCount
 };
 
+static_assert(kR == kL + 1 && kRs == kLs + 1 && kRc == kLc + 1 && kRsd == kLsd + 1 &&
+              kRrs == kRls + 1);
+
 constexpr Speaker SpeakerOf(Label label) noexcept {
   switch (label) {
     case Label::FrontLeft:
