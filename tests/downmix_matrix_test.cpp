@@ -4,7 +4,9 @@
 #include <algorithm>
 #include <climits>
 #include <cmath>
+#include <iterator>
 #include <limits>
+#include <random>
 #include <sstream>
 #include <string>
 #include <vector>
@@ -126,35 +128,64 @@ std::size_t Mirror(const AudioChannelLayout& layout, std::size_t k) {
   return partner == layout.end() ? k : static_cast<std::size_t>(partner - layout.begin());
 }
 
+// Where the down-mix applies: finite, symmetric, every channel but the LFE
+// folded in, no row above full scale; elsewhere the routing matrix. Returns
+// whether it applied.
+bool ExpectDownmixProperties(const AudioChannelLayout& source,
+                             const AudioChannelLayout& destination) {
+  ChannelConversionMatrix rows;
+  ComputeDownmixMatrix(source, destination, rows);
+  if (!DownmixApplies(source, destination)) {
+    ChannelConversionMatrix routing;
+    ComputeChannelConversionMatrix(source, destination, routing);
+    EXPECT_EQ(rows, routing);
+    return false;
+  }
+  std::vector<bool> reached(source.size(), false);
+  for (std::size_t j = 0; j < rows.size(); ++j) {
+    double sum = 0.0;
+    for (std::size_t i = 0; i < source.size(); ++i) {
+      EXPECT_TRUE(std::isfinite(rows[j][i]));
+      sum += std::fabs(rows[j][i]);
+      reached[i] = reached[i] || rows[j][i] != 0.0;
+      EXPECT_EQ(rows[j][i], rows[Mirror(destination, j)][Mirror(source, i)]);
+    }
+    EXPECT_LE(sum, 1.0 + 1e-12) << "row " << j;
+  }
+  for (std::size_t i = 0; i < source.size(); ++i) {
+    EXPECT_TRUE(reached[i] || source[i].label == Label::LowFrequency) << "channel " << i;
+  }
+  return true;
+}
+
 TEST(ComputeDownmixMatrix, EveryPairOfNamedLayoutsFoldsEveryChannelWithinFullScale) {
   std::size_t downmixes = 0;
   testing::ForEachPairOfNamedLayouts(
       [&](const AudioChannelLayout& source, const AudioChannelLayout& destination) {
-        ChannelConversionMatrix rows;
-        ComputeDownmixMatrix(source, destination, rows);
-        if (!DownmixApplies(source, destination)) {
-          ChannelConversionMatrix routing;
-          ComputeChannelConversionMatrix(source, destination, routing);
-          EXPECT_EQ(rows, routing);
-          return;
-        }
-        ++downmixes;
-        std::vector<bool> reached(source.size(), false);
-        for (std::size_t j = 0; j < rows.size(); ++j) {
-          double sum = 0.0;
-          for (std::size_t i = 0; i < source.size(); ++i) {
-            ASSERT_TRUE(std::isfinite(rows[j][i]));
-            sum += std::fabs(rows[j][i]);
-            reached[i] = reached[i] || rows[j][i] != 0.0;
-            EXPECT_EQ(rows[j][i], rows[Mirror(destination, j)][Mirror(source, i)]);
-          }
-          EXPECT_LE(sum, 1.0 + 1e-12) << "row " << j;
-        }
-        for (std::size_t i = 0; i < source.size(); ++i) {
-          EXPECT_TRUE(reached[i] || source[i].label == Label::LowFrequency) << "channel " << i;
-        }
+        downmixes += ExpectDownmixProperties(source, destination);
       });
   EXPECT_EQ(downmixes, 1616u);
+}
+
+TEST(ComputeDownmixMatrix, EveryPairOfFoldableSpeakerSetsInAnyOrderFoldsWithinFullScaleExhaustive) {
+  const std::string kGroups[] = {"L R", "C", "LFE", "Ls Rs", "Cs", "Lc Rc", "Lsd Rsd", "Rls Rrs"};
+  std::mt19937 random(20261207);
+  std::vector<AudioChannelLayout> layouts;
+  for (unsigned set = 1; set < 1u << std::size(kGroups); ++set) {
+    std::string text;
+    for (std::size_t k = 0; k < std::size(kGroups); ++k) {
+      if ((set >> k) & 1) text += " " + kGroups[k];
+    }
+    layouts.push_back(ParseLayout(text));
+    std::shuffle(layouts.back().begin(), layouts.back().end(), random);
+  }
+  for (const AudioChannelLayout& source : layouts) {
+    for (const AudioChannelLayout& destination : layouts) {
+      SCOPED_TRACE(LayoutText(source) + " -> " + LayoutText(destination));
+      ExpectDownmixProperties(source, destination);
+      if (::testing::Test::HasFailure()) return;
+    }
+  }
 }
 
 TEST(ComputeDownmixMatrix, FoldsRearSurroundsKeepsLevelsInRangeAndFallsBackWhereNoFoldApplies) {
