@@ -114,8 +114,9 @@ struct DownmixLevels {
 //
 // With levels.normalize, when some row's sum of absolute gains exceeds 1.0,
 // every gain is divided by the largest such sum: one factor for the whole
-// matrix, so the balance between destination channels is kept (5.1 into 5.1
-// side keeps 1.0 on every channel; 7.1 into 5.1 scales LFE too).
+// matrix, so the balance between destination channels is kept: 5.1 into
+// L R C LFE Lsd Rsd keeps 1.0 everywhere, while L R C LFE Ls Rs Lsd Rsd into
+// 5.1 scales every gain, the LFE's too, by 1 / (1 + r).
 //
 // Pure; safe from any thread. Like ComputeChannelConversionMatrix, `result` is
 // replaced only once the new matrix is complete, and its storage is reused when
