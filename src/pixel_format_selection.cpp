@@ -182,20 +182,26 @@ std::uint64_t RowBytes(PixelFormat pf, std::uint64_t width) noexcept {
   return 0;
 }
 
-// Appends a plane to `layout`.
-void AddPlane(PixelFormatPlaneLayout& layout, std::uint64_t offset, std::uint64_t rowBytes,
-              std::uint64_t rows) noexcept {
-  layout.planes[static_cast<std::size_t>(layout.count++)] = {offset, rowBytes, rows};
-}
+// Where LayOutFrame puts the planes: PixelFormatSize wants none of them (and
+// is as fast as if they were never worked out), GetPixelFormatPlaneLayout all.
+struct NoPlanes {
+  void Add(std::uint64_t, std::uint64_t, std::uint64_t) noexcept {}
+};
+struct Planes {
+  void Add(std::uint64_t offset, std::uint64_t rowBytes, std::uint64_t rows) noexcept {
+    layout.planes[static_cast<std::size_t>(layout.count++)] = {offset, rowBytes, rows};
+  }
+  PixelFormatPlaneLayout layout;
+};
 
-// The bytes of a frame, and its planes added to `planes` (which starts empty).
+// The bytes of a frame, and its planes added to `planes`.
 // The size is 0 for a width or height of 0 or less, when it does not fit 64
 // bits, and for formats with no known layout; the planes are then meaningless.
 // DV frames have their fixed size and no planes; so do 4:2:0 and 4:2:2
 // biplanar words of depths their size rule does not provide for (no catalogue
 // row has one).
-std::uint64_t LayOutFrame(PixelFormat pf, int width, int height,
-                          PixelFormatPlaneLayout& planes) noexcept {
+template <typename Sink>
+std::uint64_t LayOutFrame(PixelFormat pf, int width, int height, Sink& planes) noexcept {
   if (width <= 0 || height <= 0) return 0;
   const PixelFormatProperties p = pf.properties;
   const auto w = static_cast<std::uint64_t>(width);
@@ -212,8 +218,8 @@ std::uint64_t LayOutFrame(PixelFormat pf, int width, int height,
       const bool wide = p.depth() == kPixelFormatDepth_10;
       const std::uint64_t stride = wide ? RoundUp(2 * RoundUp(w, 2), 128) : RoundUp(w, 128);
       if (wide || p.depth() == kPixelFormatDepth_8) {
-        AddPlane(planes, 0, stride, h);
-        AddPlane(planes, stride * h, stride, chromaRows);
+        planes.Add(0, stride, h);
+        planes.Add(stride * h, stride, chromaRows);
       }
       return ProductOrZero(rows420, stride);
     }
@@ -223,7 +229,7 @@ std::uint64_t LayOutFrame(PixelFormat pf, int width, int height,
       const std::uint64_t row = RowBytes(pf, w);
       const auto count = static_cast<std::uint64_t>(GetNumberOfPlanes(pf));
       for (std::uint64_t i = 0; i < count && p.depth() <= kPixelFormatDepth_16; ++i) {
-        AddPlane(planes, i * row * h, row, h);
+        planes.Add(i * row * h, row, h);
       }
       return ProductOrZero(count, row, h);
     }
@@ -235,9 +241,9 @@ std::uint64_t LayOutFrame(PixelFormat pf, int width, int height,
       const std::uint64_t paddedHeight = RoundUp(h, 32);
       if (p.depth() == kPixelFormatDepth_8) {
         const std::uint64_t v = paddedHeight * stride;
-        AddPlane(planes, 0, stride, h);
-        AddPlane(planes, v, chromaStride, chromaRows);
-        AddPlane(planes, v + paddedHeight / 2 * chromaStride, chromaStride, chromaRows);
+        planes.Add(0, stride, h);
+        planes.Add(v, chromaStride, chromaRows);
+        planes.Add(v + paddedHeight / 2 * chromaStride, chromaStride, chromaRows);
       }
       const std::uint64_t size = ProductOrZero(paddedHeight, stride + chromaStride);
       return size == 0 ? 0 : size + chromaStride;
@@ -247,7 +253,7 @@ std::uint64_t LayOutFrame(PixelFormat pf, int width, int height,
   const std::uint64_t row = RowBytes(pf, w);
   const auto count =
       p.interleaving() == kPlanar ? static_cast<std::uint64_t>(GetNumberOfPlanes(pf)) : 1;
-  for (std::uint64_t i = 0; i < count; ++i) AddPlane(planes, i * row * h, row, h);
+  for (std::uint64_t i = 0; i < count; ++i) planes.Add(i * row * h, row, h);
   return ProductOrZero(row, count, h);
 }
 
@@ -425,14 +431,14 @@ std::uint64_t UncompressedPixelFormatRowBytes(PixelFormat pf, int width) noexcep
 }
 
 std::uint64_t PixelFormatSize(PixelFormat pf, int width, int height) noexcept {
-  PixelFormatPlaneLayout unused;
-  return LayOutFrame(pf, width, height, unused);
+  NoPlanes none;
+  return LayOutFrame(pf, width, height, none);
 }
 
 PixelFormatPlaneLayout GetPixelFormatPlaneLayout(PixelFormat pf, int width, int height) noexcept {
-  PixelFormatPlaneLayout layout;
-  if (!pf.properties.IsSpecific() || LayOutFrame(pf, width, height, layout) == 0) return {};
-  return layout;
+  Planes planes;
+  if (!pf.properties.IsSpecific() || LayOutFrame(pf, width, height, planes) == 0) return {};
+  return planes.layout;
 }
 
 void FixedSizedFormatDimensions(PixelFormat pf, int& width, int& height) noexcept {
