@@ -125,9 +125,9 @@ struct PixelFormatPlaneLayout {
 //   - 4:2:0 biplanar (NV12, and the YVU rows, whose pairs hold Cr first): a
 //     luma plane of `height` rows, then directly after it a plane of
 //     (height + 1) / 2 rows of chroma pairs, both with a stride of `width`
-//     rounded up to 128 bytes (P010: 16-bit samples, a stride of 2 * width,
-//     rounded up to an even width, rounded up to 128 bytes);
-//     the buffer holds one spare row of that stride after the chroma plane;
+//     rounded up to 128 bytes (P010: 16-bit samples, so twice `width` rounded
+//     up to even, then rounded up to 128 bytes); the buffer holds one spare
+//     row of that stride after the chroma plane;
 //   - 4:2:0 planar (the YV12 family): Y, then V (Cr), then U (Cb). The luma
 //     stride is `width` rounded up to 128 bytes, the chroma stride
 //     (width + 1) / 2 rounded up to 128. The buffer reserves H rows of luma
@@ -138,8 +138,12 @@ struct PixelFormatPlaneLayout {
 // Field- and frame-picture 4:2:0 formats share their layout. count is 0 for DV
 // and other compressed packings, for words that are not specific
 // (kPixelFormat_Any, kPixelFormat_Invalid), for a width or height of 0 or
-// less, and wherever PixelFormatSize() is 0 (the size does not fit 64 bits, or
-// the format has no known layout).
+// less, wherever PixelFormatSize() is 0 (the size does not fit 64 bits, or the
+// format has no known layout), and for custom 4:2:0 or biplanar words of a
+// depth these layouts do not provide for.
+//
+//   const PixelFormat nv12 = kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_8u_709;
+//   GetPixelFormatPlaneLayout(nv12, 1920, 1080);  // {0, 1920, 1080}, {2073600, 1920, 540}
 ZEBMEDIATYPES_API PixelFormatPlaneLayout GetPixelFormatPlaneLayout(PixelFormat pf, int width,
                                                                    int height) noexcept;
 
