@@ -83,6 +83,12 @@ constexpr int kSizes[][2] = {
     {1, 1},       {2, 2},         {3, 3},       {479, 359},   {1921, 1081},      {257, 31},
     {4096, 2160}, {16384, 16384}, {INT_MAX, 1}, {1, INT_MAX}, {INT_MAX, INT_MAX}};
 
+// A custom word: `pf` at another depth.
+PixelFormat WithDepth(PixelFormat pf, PixelFormatDepth depth) {
+  pf.properties.SetDepth(depth);
+  return pf;
+}
+
 // "offset:rowBytes x rows" for each plane.
 std::string Describe(const PixelFormatPlaneLayout& layout) {
   std::ostringstream text;
@@ -419,6 +425,9 @@ TEST(PixelFormatPlaneLayout, GoldenLayouts) {
       {p010, 65, 1, "0:256x1 256:256x1"},  // 33 pairs of 16-bit samples
       {kAny, 480, 360, ""},
       {kInvalid, 480, 360, ""},
+      {WithDepth(yv12, kPixelFormatDepth_16), 480, 360, ""},  // samples wider than the strides
+      {WithDepth(nv12, kPixelFormatDepth_32), 480, 360, ""},
+      {WithDepth(kPixelFormat_YUV_422_BiPlanar_10u_as16u, kPixelFormatDepth_32), 480, 360, ""},
   };
   for (const Case& c : kCases) {
     SCOPED_TRACE(testing::Message() << c.format.fourCC << " " << c.width << "x" << c.height);
