@@ -1,11 +1,13 @@
-// Video format benchmarks: frame and row sizes side by side with libavutil's
-// av_image_get_buffer_size / av_image_get_linesize on the nearest equivalent
+// Video format benchmarks: frame and row sizes and plane layouts side by side
+// with libavutil's av_image_get_buffer_size / av_image_get_linesize /
+// av_image_fill_linesizes + av_image_fill_plane_sizes on the nearest equivalent
 // formats, plus the catalogue lookups and format selection.
 //
 // After the benchmarks the program prints, for each pair, "ours X ns, peer Y
 // ns, ratio Z" (ratio = ours / peer, per call).
 #include <benchmark/benchmark.h>
 
+#include <cstddef>
 #include <cstdint>
 #include <cstdio>
 #include <iterator>
@@ -122,6 +124,40 @@ void PeerRowBytes(benchmark::State& state) {
   SetPerCall(state, before);
 }
 
+void OursPlaneLayout(benchmark::State& state) {
+  const auto before = zmt::bench::AllocationCount();
+  for (auto _ : state) {
+    for (const FormatPair& f : kFormats) {
+      PixelFormat pf = f.ours;
+      benchmark::DoNotOptimize(pf);
+      for (const Size& s : kSizes) {
+        benchmark::DoNotOptimize(GetPixelFormatPlaneLayout(pf, s.width, s.height));
+      }
+    }
+  }
+  SetPerCall(state, before);
+}
+
+// The peer's strides and plane sizes: what it takes there to locate the planes.
+void PeerPlaneLayout(benchmark::State& state) {
+  const auto before = zmt::bench::AllocationCount();
+  for (auto _ : state) {
+    for (const FormatPair& f : kFormats) {
+      AVPixelFormat pf = f.peer;
+      benchmark::DoNotOptimize(pf);
+      for (const Size& s : kSizes) {
+        int lineSizes[4];
+        av_image_fill_linesizes(lineSizes, pf, s.width);
+        const std::ptrdiff_t strides[4] = {lineSizes[0], lineSizes[1], lineSizes[2], lineSizes[3]};
+        std::size_t planeBytes[4];
+        benchmark::DoNotOptimize(av_image_fill_plane_sizes(planeBytes, pf, s.height, strides));
+        benchmark::DoNotOptimize(planeBytes);
+      }
+    }
+  }
+  SetPerCall(state, before);
+}
+
 void LookupPropertiesForNameAll(benchmark::State& state) {
   for (auto _ : state) {
     for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
@@ -197,6 +233,9 @@ int main(int argc, char** argv) {
   benchmark::RegisterBenchmark("UncompressedPixelFormatRowBytes/ours", OursRowBytes);
   benchmark::RegisterBenchmark("UncompressedPixelFormatRowBytes/av_image_get_linesize",
                                PeerRowBytes);
+  benchmark::RegisterBenchmark("GetPixelFormatPlaneLayout/ours", OursPlaneLayout);
+  benchmark::RegisterBenchmark("GetPixelFormatPlaneLayout/av_image_fill_plane_sizes",
+                               PeerPlaneLayout);
   benchmark::RegisterBenchmark("LookupPropertiesForName", LookupPropertiesForNameAll);
   benchmark::RegisterBenchmark("GuessNameForProperties", GuessNameForPropertiesAll);
   benchmark::RegisterBenchmark("SelectNearestPixelFormat", SelectNearestPixelFormatTypical);
@@ -209,6 +248,9 @@ int main(int argc, char** argv) {
   reporter.PrintPair("UncompressedPixelFormatRowBytes vs av_image_get_linesize",
                      "UncompressedPixelFormatRowBytes/ours",
                      "UncompressedPixelFormatRowBytes/av_image_get_linesize");
+  reporter.PrintPair("GetPixelFormatPlaneLayout vs av_image_fill_linesizes + plane_sizes",
+                     "GetPixelFormatPlaneLayout/ours",
+                     "GetPixelFormatPlaneLayout/av_image_fill_plane_sizes");
   benchmark::Shutdown();
   return 0;
 }

@@ -1,6 +1,7 @@
 #include <zebmediatypes/pixel_format_selection.h>
 
 #include <algorithm>
+#include <cstddef>
 #include <cstdint>
 #include <iterator>
 
@@ -181,6 +182,81 @@ std::uint64_t RowBytes(PixelFormat pf, std::uint64_t width) noexcept {
   return 0;
 }
 
+// Where LayOutFrame puts the planes: PixelFormatSize wants none of them (and
+// is as fast as if they were never worked out), GetPixelFormatPlaneLayout all.
+struct NoPlanes {
+  void Add(std::uint64_t, std::uint64_t, std::uint64_t) noexcept {}
+};
+struct Planes {
+  void Add(std::uint64_t offset, std::uint64_t rowBytes, std::uint64_t rows) noexcept {
+    layout.planes[static_cast<std::size_t>(layout.count++)] = {offset, rowBytes, rows};
+  }
+  PixelFormatPlaneLayout layout;
+};
+
+// The bytes of a frame, and its planes added to `planes`.
+// The size is 0 for a width or height of 0 or less, when it does not fit 64
+// bits, and for formats with no known layout; the planes are then meaningless.
+// DV frames have their fixed size and no planes; so do 4:2:0 and 4:2:2
+// biplanar words of depths their size rule does not provide for (no catalogue
+// row has one).
+template <typename Sink>
+std::uint64_t LayOutFrame(PixelFormat pf, int width, int height, Sink& planes) noexcept {
+  if (width <= 0 || height <= 0) return 0;
+  const PixelFormatProperties p = pf.properties;
+  const auto w = static_cast<std::uint64_t>(width);
+  const auto h = static_cast<std::uint64_t>(height);
+
+  if (const DVGeometry* dv = FindDVGeometry(p)) return dv->bytesPerFrame;
+
+  if (p.isYUV()) {
+    // Luma rows, then half as many chroma rows (rounded up), plus one spare row.
+    const std::uint64_t chromaRows = (h + 1) / 2;
+    const std::uint64_t rows420 = h + chromaRows + 1;
+    if (IsBiPlanar420Packing(p.packing()) && p.subsampling() == kPixelFormatSubsampling_420) {
+      // 10-bit words hold 16-bit samples; the chroma row of an odd width holds a whole pair.
+      const bool wide = p.depth() == kPixelFormatDepth_10;
+      const std::uint64_t stride = wide ? RoundUp(2 * RoundUp(w, 2), 128) : RoundUp(w, 128);
+      if (wide || p.depth() == kPixelFormatDepth_8) {
+        planes.Add(0, stride, h);
+        planes.Add(stride * h, stride, chromaRows);
+      }
+      return ProductOrZero(rows420, stride);
+    }
+    if (p.subsampling() == kPixelFormatSubsampling_422 && p.interleaving() == kInterleavedChroma) {
+      // A luma plane and a plane of chroma pairs, each row as wide as the
+      // format's row bytes, which hold samples of up to 16 bits.
+      const std::uint64_t row = RowBytes(pf, w);
+      const auto count = static_cast<std::uint64_t>(GetNumberOfPlanes(pf));
+      for (std::uint64_t i = 0; i < count && p.depth() <= kPixelFormatDepth_16; ++i) {
+        planes.Add(i * row * h, row, h);
+      }
+      return ProductOrZero(count, row, h);
+    }
+    if (IsPlanar420Packing(p.packing()) && p.subsampling() == kPixelFormatSubsampling_420) {
+      // Y, then the V and U planes of half width (rounded up), each given half
+      // the padded height's rows, then one spare chroma row.
+      const std::uint64_t stride = RoundUp(w, 128);
+      const std::uint64_t chromaStride = RoundUp((w + 1) / 2, 128);
+      const std::uint64_t paddedHeight = RoundUp(h, 32);
+      if (p.depth() == kPixelFormatDepth_8) {
+        const std::uint64_t v = paddedHeight * stride;
+        planes.Add(0, stride, h);
+        planes.Add(v, chromaStride, chromaRows);
+        planes.Add(v + paddedHeight / 2 * chromaStride, chromaStride, chromaRows);
+      }
+      const std::uint64_t size = ProductOrZero(paddedHeight, stride + chromaStride);
+      return size == 0 ? 0 : size + chromaStride;
+    }
+  }
+  if (!p.IsSpecific() || p.packing() != kPixelFormatPacking_Uncompressed) return 0;
+  const std::uint64_t row = RowBytes(pf, w);
+  const auto count =
+      p.interleaving() == kPlanar ? static_cast<std::uint64_t>(GetNumberOfPlanes(pf)) : 1;
+  for (std::uint64_t i = 0; i < count; ++i) planes.Add(i * row * h, row, h);
+  return ProductOrZero(row, count, h);
+}
+
 }  // namespace
 
 int PixelConversionCost(const PixelFormatProperties& from, const PixelFormatProperties& to,
@@ -355,42 +431,14 @@ std::uint64_t UncompressedPixelFormatRowBytes(PixelFormat pf, int width) noexcep
 }
 
 std::uint64_t PixelFormatSize(PixelFormat pf, int width, int height) noexcept {
-  if (width <= 0 || height <= 0) return 0;
-  const PixelFormatProperties p = pf.properties;
-  const auto w = static_cast<std::uint64_t>(width);
-  const auto h = static_cast<std::uint64_t>(height);
+  NoPlanes none;
+  return LayOutFrame(pf, width, height, none);
+}
 
-  if (const DVGeometry* dv = FindDVGeometry(p)) return dv->bytesPerFrame;
-
-  if (p.isYUV()) {
-    // Luma rows, then half as many chroma rows (rounded up), plus one spare row.
-    const std::uint64_t rows420 = h + (h + 1) / 2 + 1;
-    const std::uint64_t stride = RoundUp(w, 128);
-    if (IsBiPlanar420Packing(p.packing()) && p.subsampling() == kPixelFormatSubsampling_420) {
-      if (p.depth() == kPixelFormatDepth_10) {
-        // 16-bit samples; the chroma row of an odd width holds a whole pair.
-        return ProductOrZero(rows420, RoundUp(2 * RoundUp(w, 2), 128));
-      }
-      return ProductOrZero(rows420, stride);
-    }
-    if (p.subsampling() == kPixelFormatSubsampling_422 && p.interleaving() == kInterleavedChroma) {
-      // A luma plane and a plane of chroma pairs, each row as wide as the
-      // format's row bytes.
-      return ProductOrZero(static_cast<std::uint64_t>(GetNumberOfPlanes(pf)), RowBytes(pf, w), h);
-    }
-    if (IsPlanar420Packing(p.packing()) && p.subsampling() == kPixelFormatSubsampling_420) {
-      // Y, then the two chroma planes of half width (rounded up) and the
-      // padded height's half rows each, then one spare chroma row.
-      const std::uint64_t chromaStride = RoundUp((w + 1) / 2, 128);
-      const std::uint64_t paddedHeight = RoundUp(h, 32);
-      const std::uint64_t size = ProductOrZero(paddedHeight, stride + chromaStride);
-      return size == 0 ? 0 : size + chromaStride;
-    }
-  }
-  if (!p.IsSpecific() || p.packing() != kPixelFormatPacking_Uncompressed) return 0;
-  const std::uint64_t planes =
-      p.interleaving() == kPlanar ? static_cast<std::uint64_t>(GetNumberOfPlanes(pf)) : 1;
-  return ProductOrZero(RowBytes(pf, w), planes, h);
+PixelFormatPlaneLayout GetPixelFormatPlaneLayout(PixelFormat pf, int width, int height) noexcept {
+  Planes planes;
+  if (!pf.properties.IsSpecific() || LayOutFrame(pf, width, height, planes) == 0) return {};
+  return planes.layout;
 }
 
 void FixedSizedFormatDimensions(PixelFormat pf, int& width, int& height) noexcept {

@@ -3,7 +3,15 @@
 
 #include <array>
 #include <climits>
+#include <cstddef>
 #include <cstdint>
+#include <sstream>
+#include <string>
+#include <utility>
+
+extern "C" {
+#include <libavutil/imgutils.h>
+}
 
 namespace zebmediatypes {
 namespace {
@@ -19,22 +27,106 @@ constexpr PixelFormat kAny = kPixelFormat_Any, kInvalid = kPixelFormat_Invalid;
 
 u128 Half(u128 v) { return (v + 1) / 2; }
 
-// The bytes a frame's planes need, from the layout alone (no padding): what
-// every buffer of PixelFormatSize bytes must hold. 0 for DV.
-u128 NeededFrameBytes(PixelFormat pf, int width, int height) {
+// The planes of a frame from the layout alone (no padding), in buffer order:
+// the bytes of the samples of one row, and the rows. None for DV.
+struct NeededPlanes {
+  std::size_t count = 0;
+  std::array<std::pair<u128, u128>, 4> planes{};  // row bytes, rows
+  void Add(u128 rowBytes, u128 rows) { planes[count++] = {rowBytes, rows}; }
+};
+
+NeededPlanes NeededPlanesOf(PixelFormat pf, int width, int height) {
   const PixelFormatProperties p = pf.properties;
   const u128 w = static_cast<u128>(width), h = static_cast<u128>(height);
   const u128 bytes = std::array<unsigned, 8>{1, 2, 2, 2, 3, 4, 0, 0}[p.depth()];  // per component
-  if (p.IsDV()) return 0;
-  if (p.subsampling() == kPixelFormatSubsampling_420)
-    return (w * h + 2 * Half(w) * Half(h)) * bytes;
-  if (p.subsampling() == kPixelFormatSubsampling_422) {
-    if (p.interleaving() == kInterleavedChroma) return (w + 2 * Half(w)) * h * bytes;
-    if (GetBytesPerPixel(pf) == 0) return (w + 5) / 6 * 16 * h;  // v210: 6 pixels in 16 bytes
-    return 4 * bytes * Half(w) * h;  // two luma and two chroma samples per pair
+  NeededPlanes needed;
+  if (p.IsDV()) return needed;
+  if (p.subsampling() == kPixelFormatSubsampling_420) {
+    needed.Add(w * bytes, h);
+    if (p.packing() >= kPixelFormatPacking_MPEG4BiPlanarField) {
+      needed.Add(2 * Half(w) * bytes, Half(h));  // chroma pairs
+    } else {
+      needed.Add(Half(w) * bytes, Half(h));  // V
+      needed.Add(Half(w) * bytes, Half(h));  // U
+    }
+  } else if (p.subsampling() == kPixelFormatSubsampling_422) {
+    if (p.interleaving() == kInterleavedChroma) {
+      needed.Add(w * bytes, h);
+      needed.Add(2 * Half(w) * bytes, h);
+    } else if (GetBytesPerPixel(pf) == 0) {
+      needed.Add((w + 5) / 6 * 16, h);  // v210: 6 pixels in 16 bytes
+    } else {
+      needed.Add(4 * bytes * Half(w), h);  // two luma and two chroma samples per pair
+    }
+  } else if (pf == kPixelFormat_RGB_444_10u) {
+    needed.Add(4 * w, h);  // 10:10:10:2
+  } else if (p.interleaving() == kPlanar) {
+    for (int i = 0; i < GetNumberOfPlanes(pf); ++i) needed.Add(w * bytes, h);
+  } else {
+    needed.Add((p.alpha() != kPixelFormatAlpha_None ? 4u : 3u) * bytes * w, h);
   }
-  if (pf == kPixelFormat_RGB_444_10u) return 4 * w * h;  // 10:10:10:2
-  return (p.alpha() != kPixelFormatAlpha_None ? 4u : 3u) * bytes * w * h;
+  return needed;
+}
+
+// What every buffer of PixelFormatSize bytes must hold. 0 for DV.
+u128 NeededFrameBytes(PixelFormat pf, int width, int height) {
+  const NeededPlanes needed = NeededPlanesOf(pf, width, height);
+  u128 bytes = 0;
+  for (std::size_t i = 0; i < needed.count; ++i) {
+    bytes += needed.planes[i].first * needed.planes[i].second;
+  }
+  return bytes;
+}
+
+// Sizes from one pixel to the limits of int, odd ones included.
+constexpr int kSizes[][2] = {
+    {1, 1},       {2, 2},         {3, 3},       {479, 359},   {1921, 1081},      {257, 31},
+    {4096, 2160}, {16384, 16384}, {INT_MAX, 1}, {1, INT_MAX}, {INT_MAX, INT_MAX}};
+
+// A custom word: `pf` at another depth.
+PixelFormat WithDepth(PixelFormat pf, PixelFormatDepth depth) {
+  pf.properties.SetDepth(depth);
+  return pf;
+}
+
+// "offset:rowBytes x rows" for each plane.
+std::string Describe(const PixelFormatPlaneLayout& layout) {
+  std::ostringstream text;
+  for (std::size_t i = 0; i < static_cast<std::size_t>(layout.count); ++i) {
+    const PixelFormatPlane& plane = layout.planes[i];
+    text << (i == 0 ? "" : " ") << plane.offset << ":" << plane.rowBytes << "x" << plane.rows;
+  }
+  return text.str();
+}
+
+// The planes are the frame's: in order from offset 0 without overlapping,
+// within PixelFormatSize, each stride holding its row, a one-plane stride being
+// the format's row bytes, and none where there is no frame to lay out.
+testing::AssertionResult LayoutHolds(PixelFormat pf, int width, int height) {
+  const PixelFormatPlaneLayout layout = GetPixelFormatPlaneLayout(pf, width, height);
+  const u128 size = PixelFormatSize(pf, width, height);
+  NeededPlanes needed = NeededPlanesOf(pf, width, height);
+  if (size == 0) needed = {};
+  bool holds = static_cast<std::size_t>(layout.count) == needed.count;
+  u128 end = 0;
+  for (std::size_t i = 0; i < layout.planes.size(); ++i) {
+    const PixelFormatPlane& plane = layout.planes[i];
+    const auto [rowBytes, rows] = needed.planes[i];
+    const bool used = i < needed.count;
+    holds =
+        holds && plane.rows == rows &&
+        (used ? plane.offset >= end && (i > 0 || plane.offset == 0) && plane.rowBytes >= rowBytes
+              : plane.offset == 0 && plane.rowBytes == 0);
+    if (used) end = plane.offset + u128{plane.rowBytes} * plane.rows;
+  }
+  const std::uint64_t firstRowBytes = UncompressedPixelFormatRowBytes(pf, width);
+  holds = holds && end <= size &&
+          (layout.count == 0 ||
+           (firstRowBytes == 0 ? layout.count > 1 : layout.planes[0].rowBytes == firstRowBytes));
+  if (holds) return testing::AssertionSuccess();
+  return testing::AssertionFailure()
+         << pf.fourCC << " " << width << "x" << height << ": " << Describe(layout) << " in "
+         << static_cast<std::uint64_t>(size);
 }
 
 TEST(PixelConversionCost, IdentityIsFreeAndEverythingElseCosts) {
@@ -266,9 +358,6 @@ TEST(PixelFormatSize, OddWidthChromaRowsCoverTheLastColumn) {
 }
 
 TEST(PixelFormatSize, FrameHoldsEveryPlaneRow) {
-  // clang-format off
-  constexpr int kSizes[][2] = {{1, 1}, {2, 2}, {3, 3}, {479, 359}, {1921, 1081}, {257, 31}, {4096, 2160}, {16384, 16384}, {INT_MAX, 1}, {1, INT_MAX}, {INT_MAX, INT_MAX}};
-  // clang-format on
   for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
     if (pf->properties.IsDV()) continue;
     for (const auto& [width, height] : kSizes) {
@@ -295,6 +384,7 @@ TEST(PixelFormatSize, FrameHoldsEveryPlaneRowExhaustive) {
       for (int height : kHeights) {
         ASSERT_GE(u128{PixelFormatSize(*pf, width, height)}, NeededFrameBytes(*pf, width, height))
             << pf->fourCC << " " << width << "x" << height;
+        ASSERT_TRUE(LayoutHolds(*pf, width, height));
       }
     }
   }
@@ -302,13 +392,90 @@ TEST(PixelFormatSize, FrameHoldsEveryPlaneRowExhaustive) {
 
 TEST(PixelFormatSize, ZeroAndNegativeDimensionsGiveZero) {
   // clang-format off
-  constexpr int kSizes[][2] = {{0, 0}, {0, 480}, {640, 0}, {-1, 480}, {640, -1}, {-640, -480}, {INT_MIN, INT_MIN}, {INT_MIN, 1}};
+  constexpr int kBadSizes[][2] = {{0, 0}, {0, 480}, {640, 0}, {-1, 480}, {640, -1}, {-640, -480}, {INT_MIN, INT_MIN}, {INT_MIN, 1}};
   // clang-format on
   for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
-    for (const auto& [width, height] : kSizes) {
+    for (const auto& [width, height] : kBadSizes) {
       SCOPED_TRACE(testing::Message() << pf->fourCC << " " << width << "x" << height);
       EXPECT_EQ(PixelFormatSize(*pf, width, height), 0u);
+      EXPECT_EQ(GetPixelFormatPlaneLayout(*pf, width, height).count, 0);
       EXPECT_TRUE(width > 0 || UncompressedPixelFormatRowBytes(*pf, width) == 0);
+    }
+  }
+}
+
+TEST(PixelFormatPlaneLayout, PlanesLieInOrderWithinTheFrameAndHoldTheirRows) {
+  for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
+    for (const auto& [width, height] : kSizes) EXPECT_TRUE(LayoutHolds(*pf, width, height));
+  }
+}
+
+TEST(PixelFormatPlaneLayout, GoldenLayouts) {
+  const PixelFormat yv12 = kPixelFormat_YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_601;
+  const PixelFormat nv12 = kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_8u_709;
+  const PixelFormat p010 = kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_10u_as16u_709;
+  struct Case {
+    PixelFormat format;
+    int width, height;
+    const char* planes;
+  };
+  const Case kCases[] = {
+      {yv12, 257, 33, "0:384x33 24576:256x17 32768:256x17"},  // V, U after 64, 32 rows
+      {nv12, 3, 3, "0:128x3 384:128x2"},
+      {p010, 65, 1, "0:256x1 256:256x1"},  // 33 pairs of 16-bit samples
+      {kAny, 480, 360, ""},
+      {kInvalid, 480, 360, ""},
+      {WithDepth(yv12, kPixelFormatDepth_16), 480, 360, ""},  // samples wider than the strides
+      {WithDepth(nv12, kPixelFormatDepth_32), 480, 360, ""},
+      {WithDepth(kPixelFormat_YUV_422_BiPlanar_10u_as16u, kPixelFormatDepth_32), 480, 360, ""},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(testing::Message() << c.format.fourCC << " " << c.width << "x" << c.height);
+    EXPECT_EQ(Describe(GetPixelFormatPlaneLayout(c.format, c.width, c.height)), c.planes);
+  }
+}
+
+TEST(PixelFormatPlaneLayout, StridesHoldTheAVUtilRowsAndRowsMatch) {
+  struct Case {
+    PixelFormat format;
+    AVPixelFormat peer;
+  };
+  // yv12 holds V before U; the two chroma planes have the same shape.
+  const Case kCases[] = {
+      {kPixelFormat_YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_601, AV_PIX_FMT_YUV420P},
+      {kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_8u_709, AV_PIX_FMT_NV12},
+      {kPixelFormat_YVU_420_MPEG4_FRAME_PICTURE_BIPLANAR_8u_709, AV_PIX_FMT_NV21},
+      {kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_10u_as16u_709, AV_PIX_FMT_P010LE},
+      {kPixelFormat_YUV_422_BiPlanar_10u_as16u, AV_PIX_FMT_P210LE},
+      {kPixelFormat_UYVY_422_8u, AV_PIX_FMT_UYVY422},
+      {kPixelFormat_YUYV_422_8u_709, AV_PIX_FMT_YUYV422},
+      {kPixelFormat_Y210_422_10u_as16u_709, AV_PIX_FMT_Y210LE},
+      {kPixelFormat_BGRA_4444_8u, AV_PIX_FMT_BGRA},
+      {kPixelFormat_ARGB_4444_8u, AV_PIX_FMT_ARGB},
+      {kPixelFormat_BGRA_4444_15u, AV_PIX_FMT_BGRA64LE},
+      {kPixelFormat_RGB_444_10u, AV_PIX_FMT_X2RGB10LE},
+      {kPixelFormat_ARGB_4444_32f_Planar, AV_PIX_FMT_GBRAPF32LE},
+      {kPixelFormat_RGB_444_32f_Planar, AV_PIX_FMT_GBRPF32LE},
+  };
+  constexpr int kPeerSizes[][2] = {{1, 1},     {2, 2},       {3, 3},    {5, 7},
+                                   {479, 359}, {1921, 1081}, {257, 31}, {4096, 2160}};
+  for (const Case& c : kCases) {
+    for (const auto& [width, height] : kPeerSizes) {
+      SCOPED_TRACE(testing::Message() << c.format.fourCC << " " << width << "x" << height);
+      int lineSizes[4] = {};
+      ASSERT_GE(av_image_fill_linesizes(lineSizes, c.peer, width), 0);
+      const ptrdiff_t strides[4] = {lineSizes[0], lineSizes[1], lineSizes[2], lineSizes[3]};
+      std::size_t planeBytes[4] = {};
+      ASSERT_GE(av_image_fill_plane_sizes(planeBytes, c.peer, height, strides), 0);
+      const PixelFormatPlaneLayout layout = GetPixelFormatPlaneLayout(c.format, width, height);
+      int peerCount = 0;
+      while (peerCount < 4 && lineSizes[peerCount] > 0) ++peerCount;
+      ASSERT_EQ(layout.count, peerCount) << Describe(layout);
+      for (std::size_t i = 0; i < static_cast<std::size_t>(peerCount); ++i) {
+        const auto peerStride = static_cast<std::uint64_t>(lineSizes[i]);
+        EXPECT_GE(layout.planes[i].rowBytes, peerStride) << i;
+        EXPECT_EQ(layout.planes[i].rows, planeBytes[i] / peerStride) << i;
+      }
     }
   }
 }

@@ -5,4 +5,10 @@ zmt_add_test(video_tests SOURCES
   pixel_aspect_ratio_test.cpp
   video_descriptions_test.cpp
 )
+if(TARGET video_tests)
+  # The plane layouts are checked against libavutil's image layouts.
+  find_package(PkgConfig REQUIRED)
+  pkg_check_modules(AVUTIL REQUIRED IMPORTED_TARGET libavutil)
+  target_link_libraries(video_tests PRIVATE PkgConfig::AVUTIL)
+endif()
 zmt_add_test(video_registry_threads_tests SOURCES pixel_format_registry_threads_test.cpp CONCURRENT)

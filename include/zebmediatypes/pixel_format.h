@@ -519,9 +519,20 @@ constexpr int GetNumberOfPlanes(PixelFormat pf) noexcept {
   }
 }
 
-// Bytes of one pixel of the first plane: for planar words one component; 0
-// where the layout has no whole bytes-per-pixel figure (V210-style packed
-// 10-bit 4:2:2, 4:2:0, DV) and for words that are not specific.
+// Bytes of one pixel of the first plane as the row rules count it, by the first
+// rule that applies, b being the bits of a component (8, 10, 16, 16, 24, 32 by
+// depth; 0 for words that are not specific):
+//   - planar words: b / 8, one component of one plane (ARgP, RGBP: 4);
+//   - 4:4:4 with an alpha slot: 4 * b / 8 (bgra 4, Bgra 8, BGra 16);
+//   - 4:2:2: 2 for chroma-interleaved YUV (P210's 16-bit luma sample); else
+//     2 * b / 8 (uyvy 2, UYvy 8); at 10 bits, 4 with an ignored-alpha slot
+//     (Y210) and 0 without one (V210: six pixels in 16 bytes);
+//   - any other 10-bit word: 4. That is RGB1, and also the 10-bit 4:2:0 P010
+//     family, although its luma samples take 2 bytes;
+//   - 4:4:4 without alpha: 3 * b / 8.
+// 0 for the 8-bit 4:2:0 formats (NV12, YV12), for DV and for the rest. The
+// strides of every plane come from GetPixelFormatPlaneLayout()
+// (pixel_format_selection.h).
 constexpr int GetBytesPerPixel(PixelFormat pf) noexcept {
   const PixelFormatProperties p = pf.properties;
   constexpr int kBits[8] = {8, 10, 16, 16, 24, 32, 0, 0};

@@ -13,6 +13,7 @@
 #include <zebmediatypes/pixel_format.h>
 #include <zebmediatypes/render_quality.h>
 
+#include <array>
 #include <cstdint>
 #include <vector>
 
@@ -89,6 +90,62 @@ ZEBMEDIATYPES_API std::uint64_t UncompressedPixelFormatRowBytes(PixelFormat pf, 
 // size does not fit 64 bits, for words that are not specific and for formats
 // with no known layout.
 ZEBMEDIATYPES_API std::uint64_t PixelFormatSize(PixelFormat pf, int width, int height) noexcept;
+
+// PixelFormatPlane
+//
+// One plane of a frame in its buffer: the byte offset of its first row, its
+// row stride in bytes (which holds every sample of the row; the rest is
+// padding) and its number of rows.
+struct PixelFormatPlane {
+  std::uint64_t offset = 0;
+  std::uint64_t rowBytes = 0;
+  std::uint64_t rows = 0;
+};
+
+// The planes of a frame in buffer order: planes[0] to planes[count - 1] are
+// used, the others stay zero. count is 0 where the frame has no whole planes.
+struct PixelFormatPlaneLayout {
+  int count = 0;
+  std::array<PixelFormatPlane, 4> planes{};
+};
+
+// GetPixelFormatPlaneLayout()
+//
+// Where each plane of a `width` x `height` frame lies in a buffer of
+// PixelFormatSize(pf, width, height) bytes. The first plane starts at offset 0;
+// each later one starts at or after the end of the one before (offset +
+// rowBytes * rows), and the last ends within the buffer. By family:
+//   - one-plane formats (packed 4:4:4, packed 4:2:2, V210, Y210, 10-bit RGB):
+//     `height` rows of UncompressedPixelFormatRowBytes(pf, width) bytes;
+//   - planar 4:4:4 (ARGB and RGB 32f planar): one such plane per component,
+//     back to back, in the order of the name (A, R, G, B or R, G, B);
+//   - 4:2:2 biplanar (P210: 16-bit samples): a luma plane of `height` rows,
+//     then a plane of `height` rows of Cb Cr pairs, both with a stride of
+//     UncompressedPixelFormatRowBytes(pf, width) bytes;
+//   - 4:2:0 biplanar (NV12, and the YVU rows, whose pairs hold Cr first): a
+//     luma plane of `height` rows, then directly after it a plane of
+//     (height + 1) / 2 rows of chroma pairs, both with a stride of `width`
+//     rounded up to 128 bytes (P010: 16-bit samples, so twice `width` rounded
+//     up to even, then rounded up to 128 bytes); the buffer holds one spare
+//     row of that stride after the chroma plane;
+//   - 4:2:0 planar (the YV12 family): Y, then V (Cr), then U (Cb). The luma
+//     stride is `width` rounded up to 128 bytes, the chroma stride
+//     (width + 1) / 2 rounded up to 128. The buffer reserves H rows of luma
+//     and H / 2 rows of each chroma plane, H being `height` rounded up to 32,
+//     so V starts at H * luma stride and U H / 2 chroma rows after V; the
+//     planes themselves have `height` and (height + 1) / 2 rows. One spare
+//     chroma row follows the reserved U rows.
+// Field- and frame-picture 4:2:0 formats share their layout. count is 0 for DV
+// and other compressed packings, for words that are not specific
+// (kPixelFormat_Any, kPixelFormat_Invalid), for a width or height of 0 or
+// less, wherever PixelFormatSize() is 0 (the size does not fit 64 bits, or the
+// format has no known layout), and for custom 4:2:0 or biplanar words of a
+// depth these layouts do not provide for.
+//
+//   const PixelFormat nv12 = kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_BIPLANAR_8u_709;
+//   GetPixelFormatPlaneLayout(nv12, 1920, 1080);  // {0, 1920, 1080}, {2073600, 1920, 540}
+ZEBMEDIATYPES_API PixelFormatPlaneLayout GetPixelFormatPlaneLayout(PixelFormat pf, int width,
+                                                                   int height) noexcept;
 
 // For a DV format, sets `width` and `height` to its fixed frame size (720x480,
 // 720x576, 960x720, 1280x1080 or 1440x1080); otherwise leaves both unchanged.
