@@ -13,8 +13,6 @@ namespace {
 constexpr const char* kSource = "AudioFrameRateUtils";
 constexpr const char* kFunction = "zebmediatypes::FindBestNativeAudioRate";
 
-constexpr std::int64_t kTicksPerSecond = details::kTicksPerSecond;
-
 // Ticks per sample of the native rates, slowest first: the named audio rates
 // up to 96000 Hz.
 constexpr auto kNativeTicks = [] {
@@ -29,7 +27,7 @@ static_assert(kNativeTicks.back() == kFrameRate_Audio96000.GetTicksPerFrame());
 constexpr std::int64_t kSlowestNativeTicks = kNativeTicks[0];
 constexpr std::int64_t kFastestNativeTicks = kNativeTicks.back();
 // 176400 Hz, twice 88200 Hz: the one rate above 96000 Hz that maps to 88200 Hz.
-constexpr std::int64_t kTwice88200Ticks = kTicksPerSecond / 176400;
+constexpr std::int64_t kTwice88200Ticks = details::kTicksPerSecond / 176400;
 // The highest multiple of a rate that the whole-multiple search accepts.
 constexpr std::uint32_t kMaxRateMultiple = 16;
 
@@ -47,12 +45,12 @@ bool IsNativeAudioRate(const FrameRate& rate) noexcept {
 FrameRate ChooseNativeRate(std::int64_t ticks) noexcept {
   // The requested rate in whole hertz; ticks lie in (kFastestNativeTicks, max)
   // here, so the quotient is below 96000 and fits 32 bits.
-  const auto hertz =
-      static_cast<std::uint32_t>(static_cast<double>(kTicksPerSecond) / static_cast<double>(ticks));
+  const auto hertz = static_cast<std::uint32_t>(static_cast<double>(details::kTicksPerSecond) /
+                                                static_cast<double>(ticks));
   if (hertz != 0) {
     for (std::int64_t native : kNativeTicks) {
       if (native >= ticks) continue;
-      const auto nativeHertz = static_cast<std::uint32_t>(kTicksPerSecond / native);
+      const auto nativeHertz = static_cast<std::uint32_t>(details::kTicksPerSecond / native);
       if (nativeHertz % hertz == 0 && nativeHertz / hertz <= kMaxRateMultiple) {
         return FrameRate(native);
       }
