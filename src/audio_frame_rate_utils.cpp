@@ -2,8 +2,9 @@
 #include <zebcore/error.h>
 #include <zebmediatypes/audio_frame_rate_utils.h>
 
+#include <array>
+#include <cstddef>
 #include <cstdint>
-#include <iterator>
 #include <limits>
 
 namespace zebmediatypes {
@@ -12,26 +13,21 @@ namespace {
 constexpr const char* kSource = "AudioFrameRateUtils";
 constexpr const char* kFunction = "zebmediatypes::FindBestNativeAudioRate";
 
-constexpr std::int64_t kTicksPerSecond = 254016000000;
-
-// Ticks per sample of the native rates, slowest first.
-constexpr std::int64_t kNativeTicks[] = {
-    31752000,  // 8000 Hz
-    23040000,  // 11025 Hz
-    15876000,  // 16000 Hz
-    11520000,  // 22050 Hz
-    7938000,   // 32000 Hz
-    5760000,   // 44100 Hz
-    5292000,   // 48000 Hz
-    2880000,   // 88200 Hz
-    2646000,   // 96000 Hz
-};
-static_assert(std::size(kNativeTicks) == 9);
+// Ticks per sample of the native rates, slowest first: the named audio rates
+// up to 96000 Hz.
+constexpr auto kNativeTicks = [] {
+  std::array<std::int64_t, 9> ticks{};
+  for (std::size_t i = 0; i < ticks.size(); ++i) {
+    ticks[i] = details::kAudioRateConstants[i].GetTicksPerFrame();
+  }
+  return ticks;
+}();
+static_assert(kNativeTicks.back() == kFrameRate_Audio96000.GetTicksPerFrame());
 
 constexpr std::int64_t kSlowestNativeTicks = kNativeTicks[0];
-constexpr std::int64_t kFastestNativeTicks = kNativeTicks[std::size(kNativeTicks) - 1];
+constexpr std::int64_t kFastestNativeTicks = kNativeTicks.back();
 // 176400 Hz, twice 88200 Hz: the one rate above 96000 Hz that maps to 88200 Hz.
-constexpr std::int64_t kTwice88200Ticks = kTicksPerSecond / 176400;
+constexpr std::int64_t kTwice88200Ticks = details::kTicksPerSecond / 176400;
 // The highest multiple of a rate that the whole-multiple search accepts.
 constexpr std::uint32_t kMaxRateMultiple = 16;
 
@@ -49,12 +45,12 @@ bool IsNativeAudioRate(const FrameRate& rate) noexcept {
 FrameRate ChooseNativeRate(std::int64_t ticks) noexcept {
   // The requested rate in whole hertz; ticks lie in (kFastestNativeTicks, max)
   // here, so the quotient is below 96000 and fits 32 bits.
-  const auto hertz =
-      static_cast<std::uint32_t>(static_cast<double>(kTicksPerSecond) / static_cast<double>(ticks));
+  const auto hertz = static_cast<std::uint32_t>(static_cast<double>(details::kTicksPerSecond) /
+                                                static_cast<double>(ticks));
   if (hertz != 0) {
     for (std::int64_t native : kNativeTicks) {
       if (native >= ticks) continue;
-      const auto nativeHertz = static_cast<std::uint32_t>(kTicksPerSecond / native);
+      const auto nativeHertz = static_cast<std::uint32_t>(details::kTicksPerSecond / native);
       if (nativeHertz % hertz == 0 && nativeHertz / hertz <= kMaxRateMultiple) {
         return FrameRate(native);
       }

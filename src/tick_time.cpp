@@ -24,23 +24,6 @@ void ReportFrameRateBreach(const char* function, int line) noexcept {
                                   "FrameRate", function, line);
 }
 
-namespace {
-
-constexpr FrameRate kAudioRateConstants[] = {
-    kFrameRate_Audio8000,  kFrameRate_Audio11025, kFrameRate_Audio16000, kFrameRate_Audio22050,
-    kFrameRate_Audio32000, kFrameRate_Audio44100, kFrameRate_Audio48000, kFrameRate_Audio88200,
-    kFrameRate_Audio96000, kFrameRate_Audio192000};
-static_assert(std::size(kAudioRateConstants) == 10);
-
-}  // namespace
-
-bool IsAudioRateConstant(FrameRate rate) noexcept {
-  for (FrameRate r : kAudioRateConstants) {
-    if (r == rate) return true;
-  }
-  return false;
-}
-
 std::string ExplainTickTimeWithFrameRate(TickTime time, FrameRate rate) {
   std::ostringstream text;
   text << "which is ";
@@ -72,9 +55,9 @@ constexpr MatchedRate kMatchedRates[] = {
 static_assert(std::size(kMatchedRates) == 6);
 constexpr double kMatchTolerance = 0.005;
 
-constexpr std::int64_t kSevenAudioTicks[] = {11520000, 7938000, 5760000, 5292000,
-                                             2880000,  2646000, 1323000};
-static_assert(std::size(kSevenAudioTicks) == 7);
+// IsFrameRateAudio() accepts the named audio rates from 22050 Hz up.
+constexpr std::size_t kFirstAudioRate = 3;
+static_assert(details::kAudioRateConstants[kFirstAudioRate] == kFrameRate_Audio22050);
 
 }  // namespace
 
@@ -89,10 +72,15 @@ FrameRate MatchedFrameRateFromFloat(double fps) noexcept {
 }
 
 bool IsFrameRateAudio(FrameRate rate) noexcept {
-  for (std::int64_t ticks : kSevenAudioTicks) {
-    if (rate.GetTicksPerFrame() == ticks) return true;
+  for (std::size_t i = kFirstAudioRate; i < std::size(details::kAudioRateConstants); ++i) {
+    if (details::kAudioRateConstants[i] == rate) return true;
   }
   return false;
+}
+
+TickTime TickTime::FromSeconds(double seconds) noexcept {
+  const double ticks = std::round(seconds * static_cast<double>(details::kTicksPerSecond));
+  return TickTime(details::CheckedTruncate(ticks, kTime_Invalid.GetTicks()));
 }
 
 std::ostream& operator<<(std::ostream& out, TickTime time) { return out << time.ToSeconds(); }

@@ -303,8 +303,8 @@ zebcore::UTF16String TimeDisplayDescription(TimeDisplay display, LocalizedDescri
 }
 
 zebcore::UTF16String FrameRateDescription(FrameRate rate) {
-  constexpr std::int64_t kSlowestAudioTicks = 31752000;  // 8000 Hz
-  const bool video = !rate.IsValid() || rate.GetTicksPerFrame() > kSlowestAudioTicks;
+  // Rates slower than the slowest named audio rate (8000 Hz) are video rates.
+  const bool video = !rate.IsValid() || rate > details::kAudioRateConstants[0];
   const zebcore::UTF16String text =
       Localize(video ? "$$$/zebmediatypes/FrameRateFormat/Video=@0fps"
                      : "$$$/zebmediatypes/FrameRateFormat/Audio=@0Hz");

@@ -9,7 +9,6 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
-#include <iterator>
 #include <limits>
 
 namespace zebmediatypes {
@@ -40,21 +39,6 @@ constexpr bool IsConsistent(const DropFrameNumbering& n) {
 constexpr DropFrameNumbering kDropFrame2997{30, 2, 1800, 1798, 17982, 107892};
 constexpr DropFrameNumbering kDropFrame5994{60, 4, 3600, 3596, 35964, 215784};
 static_assert(IsConsistent(kDropFrame2997) && IsConsistent(kDropFrame5994));
-
-// Audio media at these rates is counted in frames of the display's nominal
-// rate rather than in samples.
-constexpr std::int64_t kAudioSampleRateTicks[] = {
-    31752000, 23040000, 15876000, 11520000, 7938000,  // 8000 to 32000 Hz
-    5760000,  5292000,  2880000,  2646000,  1323000,  // 44100 to 192000 Hz
-};
-static_assert(std::size(kAudioSampleRateTicks) == 10);
-
-bool IsAudioSampleRateConstant(FrameRate rate) noexcept {
-  for (std::int64_t ticks : kAudioSampleRateTicks) {
-    if (rate.GetTicksPerFrame() == ticks) return true;
-  }
-  return false;
-}
 
 bool IsKnownDisplayType(TimeDisplayType type) noexcept {
   const int code = static_cast<int>(type);
@@ -90,8 +74,10 @@ std::int64_t FramesPerFoot(TimeDisplay display) noexcept {
   return display.GetType() == kTimeDisplay_16mmFeetFrames ? 40 : 16;
 }
 
+// Audio media at one of the named sample rates is counted in frames of the
+// display's nominal rate rather than in samples.
 FrameRate CountingRate(FrameRate rate, TimeDisplay display) {
-  return IsAudioSampleRateConstant(rate) ? GetFrameRateForTimeDisplay(display, rate) : rate;
+  return details::IsAudioRateConstant(rate) ? GetFrameRateForTimeDisplay(display, rate) : rate;
 }
 
 // Display frames per second, at least 1 (a custom display may hold 0).
@@ -536,14 +522,33 @@ void TimeToHMSF(unsigned& hours, unsigned& minutes, unsigned& seconds, std::uint
   negative = f.negative;
 }
 
-TickTime TimecodeToTime(std::u16string_view text, FrameRate rate, TimeDisplay display,
-                        zebcore::utility::Flags<unsigned int> flags) {
+std::optional<TickTime> TryTimecodeToTime(std::u16string_view text, FrameRate rate,
+                                          TimeDisplay display,
+                                          zebcore::utility::Flags<unsigned int> flags) {
   if (text.empty()) return kTime_Zero;
   display = ResolveDisplay(display, rate);
   const bool inclusive = flags.IsSet(kTimecodeFlag_InclusiveEnd);
   const Reading r = IsFilmDisplay(display) ? ReadFilm(text, rate, display, inclusive)
                                            : ReadHMSF(text, rate, display, inclusive);
-  return r.ok ? TickTime(r.ticks) : kTime_Invalid;
+  if (!r.ok) return std::nullopt;
+  return TickTime(r.ticks);
+}
+
+std::optional<TickTime> TryTimecodeToTime(std::string_view text, FrameRate rate,
+                                          TimeDisplay display,
+                                          zebcore::utility::Flags<unsigned int> flags) {
+  return TryTimecodeToTime(zebcore::string::View(zebcore::string::UTF8to16(text)), rate, display,
+                           flags);
+}
+
+TickTime TimecodeToTime(std::u16string_view text, FrameRate rate, TimeDisplay display,
+                        zebcore::utility::Flags<unsigned int> flags) {
+  return TryTimecodeToTime(text, rate, display, flags).value_or(kTime_Invalid);
+}
+
+TickTime TimecodeToTime(std::string_view text, FrameRate rate, TimeDisplay display,
+                        zebcore::utility::Flags<unsigned int> flags) {
+  return TryTimecodeToTime(text, rate, display, flags).value_or(kTime_Invalid);
 }
 
 boost::rational<std::int64_t> TimecodeToRatioTime(std::u16string_view text, FrameRate rate,

@@ -21,7 +21,7 @@ expect() {
     printf 'FAIL %s: output\n  got:    %s\n  wanted: %s\n' "$name" "$got_out" "$out"
     failures=$((failures + 1))
   fi
-  if [ -n "$err" ] && ! grep -q -- "$err" <<<"$got_err"; then
+  if [ -n "$err" ] && { ! grep -q -- "$err" <<<"$got_err" || [ "$(wc -l <<<"$got_err")" != 1 ]; }; then
     echo "FAIL $name: standard error '$got_err' lacks '$err'"; failures=$((failures + 1))
   fi
   if [ -z "$err" ] && [ -n "$got_err" ]; then
@@ -38,6 +38,12 @@ expect "non-drop" 0 "$ndf" "" -- "$console" zebmediatypes.TimeToTimecode 1800 29
 expect "typed back" 0 "$back" "" -- "$console" zebmediatypes.TimecodeToTime "00;01;00;02" 29.97 29.97 -d
 expect "unknown command" 2 "" "unknown command 'nosuch'" -- "$console" nosuch 1 2 3
 expect "unknown option" 2 "" "unknown option '--bogus'" -- "$console" --bogus
+# Arguments reach the command joined by blanks: one that is empty or holds a
+# blank would shift the others, so it is refused.
+expect "empty argument" 2 "" "argument 2 is empty" -- "$console" zebmediatypes.TimecodeToTime "" 25 25
+expect "empty command" 2 "" "argument 1 is empty" -- "$console" ""
+expect "blank inside" 2 "" "argument 2 holds a blank" -- "$console" zebmediatypes.TimecodeToTime "1 2" 25 25
+expect "line break inside" 2 "" "argument 3 holds a blank" -- "$console" zebmediatypes.TimecodeToTime 1 $'25\n' 25
 
 usage=$("$console" --help); code=$?
 if [ $code != 0 ] || ! grep -q '^usage: zebmediatypes-console' <<<"$usage"; then
@@ -48,6 +54,9 @@ if [ $code != 0 ] || ! grep -q '^zebmediatypes.TimeToTimecode$' <<<"$help" ||
    ! grep -q '^zebmediatypes.TimecodeToTime$' <<<"$help" ||
    ! grep -q 'This command will convert a timecode string' <<<"$help"; then
   echo "FAIL help: exit $code, output '$help'"; failures=$((failures + 1))
+fi
+if awk 'length > 80 { found = 1 } END { exit !found }' <<<"$help"; then
+  echo "FAIL help: lines wider than 80 columns"; failures=$((failures + 1))
 fi
 
 # Lines from standard input, until "quit": the line after it is not run.

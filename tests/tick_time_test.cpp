@@ -111,6 +111,54 @@ TEST(TickTime, DoubleResultsAreCheckedBeforeConversion) {
   EXPECT_EQ(capture.Count(), 0u);
 }
 
+TEST(TickTime, FromSecondsRoundsToTheNearestTickAndClamps) {
+  struct Case {
+    double seconds;
+    TickTime expected;
+  };
+  const Case kCases[] = {
+      {1.001, TickTime(30, kFrameRate_Video29_97)},
+      {-1.001, TickTime(-30, kFrameRate_Video29_97)},
+      {0.5, kTime_OneSecond / 2},
+      {1e-12, kTime_Zero},   // 0.254 ticks
+      {3e-12, TickTime(1)},  // 0.762 ticks
+      {-3e-12, TickTime(-1)},
+      {kNaN, kTime_Invalid},
+      {4e7, TickTime(kInt64Max)},
+      {-4e7, TickTime(kInt64Min)},
+      {kInf, TickTime(kInt64Max)},
+      {-kInf, TickTime(kInt64Min)},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.seconds);
+    EXPECT_EQ(TickTime::FromSeconds(c.seconds), c.expected);
+  }
+  // Below 2^51 ticks a double holds every tick: the seconds read back exactly.
+  std::mt19937_64 random(51);
+  for (int i = 0; i < 10000; ++i) {
+    const auto t = static_cast<std::int64_t>(random() >> (13 + i % 50)) * (i % 2 != 0 ? -1 : 1);
+    ASSERT_EQ(TickTime::FromSeconds(TickTime(t).ToSeconds()), TickTime(t)) << t;
+  }
+}
+
+TEST(TickTime, EveryFrameStartWithinADaySurvivesSecondsAsDouble) {
+  const FrameRate kVideoRates[] = {
+      kFrameRate_Video11_988, kFrameRate_Video14_985, kFrameRate_Video23_976, kFrameRate_Video24,
+      kFrameRate_Video25,     kFrameRate_Video29_97,  kFrameRate_Video30,     kFrameRate_Video48,
+      kFrameRate_Video50,     kFrameRate_Video59_94,  kFrameRate_Video60,     kFrameRate_Video100,
+      kFrameRate_Video119_88};
+  for (FrameRate rate : kVideoRates) {
+    const std::int64_t last = (kTime_OneHour * 24).ToFrame64(rate);
+    for (std::int64_t f = -last; f <= last; ++f) {
+      const TickTime start(f, rate);
+      TickTime back = TickTime::FromSeconds(start.ToSeconds());
+      if (back.AlignToNearestFrame(rate) != start) {
+        FAIL() << "frame " << f << " at " << rate.GetTicksPerFrame() << " ticks/frame";
+      }
+    }
+  }
+}
+
 TEST(FrameRate, InvalidRateStaysInvalidAndMultiplyByZeroReports) {
   zebcore::debug::ScopedAssertionCapture capture;
   // clang-format off

@@ -25,12 +25,16 @@ TEST(TimeRange, DurationIsInvalidWithoutBothEnds) {
 
 TEST(TimeRange, StartPlusDurationSaturatesAtTimeMax) {
   const std::int64_t kInt64Max = std::numeric_limits<std::int64_t>::max();
+  const std::int64_t kInt64Min = std::numeric_limits<std::int64_t>::min();
   // clang-format off
   const std::tuple<const char*, TickTime, TickTime, TickTime> kCases[] = {
       {"start and duration", sec1, sec2, sec3}, {"negative duration", sec3, -sec2, sec1}, {"just fits", kTime_Max - sec1, sec1, kTime_Max},
       {"one tick over", kTime_Max - sec1, sec1 + TickTime(1), kTime_Max}, {"huge duration", sec1, TickTime(kInt64Max), kTime_Max},
       {"sum beyond int64", TickTime(kInt64Max - 5), TickTime(10), kTime_Max},  // the raw sum wraps
-      {"invalid start", kTime_Invalid, sec1, kTime_Invalid}, {"invalid duration", sec1, kTime_Invalid, kTime_Invalid}};
+      {"invalid start", kTime_Invalid, sec1, kTime_Invalid}, {"invalid duration", sec1, kTime_Invalid, kTime_Invalid},
+      // Below, only the 64-bit range is a bound.
+      {"below kTime_Min", kTime_Min, -sec1, kTime_Min - sec1},
+      {"sum below int64", TickTime(kInt64Min + 5), TickTime(-10), TickTime(kInt64Min)}};
   // clang-format on
   for (const auto& [label, start, duration, end] : kCases) {
     EXPECT_EQ(TimeRange(start, TimeRange::Duration(duration)), TimeRange(start, end)) << label;

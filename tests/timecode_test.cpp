@@ -5,6 +5,7 @@
 #include <cstdint>
 #include <iterator>
 #include <limits>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -26,8 +27,17 @@ std::u16string Wide(std::string_view text) {
 std::string Format(std::int64_t frames, FrameRate rate, TimeDisplay display, Flags flags = {}) {
   return Narrow(TimeToTimecode(TickTime(frames, rate), rate, display, flags));
 }
+// Reads through TimecodeToTime and checks that the UTF-8 reader and both Try
+// readers agree with it: nullopt exactly where it gives kTime_Invalid.
 TickTime Parse(std::string_view text, FrameRate rate, TimeDisplay display, Flags flags = {}) {
-  return TimecodeToTime(Wide(text), rate, display, flags);
+  const TickTime time = TimecodeToTime(Wide(text), rate, display, flags);
+  EXPECT_EQ(TimecodeToTime(text, rate, display, flags), time);
+  const std::optional<TickTime> wide = TryTimecodeToTime(Wide(text), rate, display, flags);
+  const std::optional<TickTime> utf8 = TryTimecodeToTime(text, rate, display, flags);
+  EXPECT_EQ(wide.has_value(), time != kTime_Invalid);
+  EXPECT_EQ(wide.value_or(kTime_Invalid), time);
+  EXPECT_EQ(utf8, wide);
+  return time;
 }
 
 constexpr TimeDisplay kDrop(kTimeDisplay_2997DropTimecode);
@@ -225,6 +235,31 @@ TEST(TimecodeToTime, BadInputGivesInvalid) {
       EXPECT_EQ(Parse(text, kFrameRate_Video24, c.display), kTime_Invalid);
     }
   }
+}
+
+TEST(TryTimecodeToTime, TextThatReadsAsTheInvalidTimeIsAValue) {
+  constexpr FrameRate kMilli = kFrameRate_Milliseconds;
+  struct Case {
+    const char* text;
+    FrameRate rate;
+    TimeDisplay display;
+  };
+  const Case kCases[] = {
+      {"-400000000", kMilli, kFrames},
+      {"-400000", FrameRate::FromFramesPerSecond(1), kFrames},
+      {"-25000000+00", kMilli, k35mm},
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.text);
+    EXPECT_EQ(TryTimecodeToTime(c.text, c.rate, c.display), kTime_Invalid);
+    EXPECT_EQ(TryTimecodeToTime(Wide(c.text), c.rate, c.display), kTime_Invalid);
+  }
+  EXPECT_EQ(TryTimecodeToTime("-400000001", kMilli, kFrames), kTime_Invalid - TickTime(1, kMilli));
+}
+
+TEST(TimecodeToTime, MillisecondsFieldIsAWholeCount) {
+  EXPECT_EQ(Parse("1.5", k8k, kMs), kTime_OneSecond + TickTime(5, kFrameRate_Milliseconds));
+  EXPECT_EQ(Parse("1.500", k8k, kMs), kTime_OneSecond * 1.5);
 }
 
 TEST(TimecodeToTime, LongFieldsCarryWithoutOverflow) {

@@ -6,7 +6,9 @@
 
 #include <cfloat>
 #include <cmath>
+#include <iomanip>
 #include <random>
+#include <sstream>
 #include <string>
 #include <vector>
 
@@ -17,6 +19,28 @@ using zebcore::UTF8String;
 using namespace zebcore::string;
 
 std::string Narrow(const UTF16String& s) { return UTF16toNarrow(View(s)); }
+
+TEST(UTF16String, PrintsAsUTF8OnANarrowStreamFoundByArgumentLookup) {
+  struct Case {
+    std::u16string text;
+    std::string utf8;
+  };
+  const Case kCases[] = {
+      {u"00;01;00;02", "00;01;00;02"},
+      {u"A\u00E9\u20AC\U0001F3AC", "A\xC3\xA9\xE2\x82\xAC\xF0\x9F\x8E\xAC"},
+      {u"a\xD800z", "a\xEF\xBF\xBDz"},  // a lone surrogate prints as U+FFFD
+  };
+  for (const Case& c : kCases) {
+    SCOPED_TRACE(c.utf8);
+    std::ostringstream out;
+    out << UTF16String(c.text.begin(), c.text.end()) << '|'
+        << ToUTF8String(c.utf8);  // byte strings print as they are
+    EXPECT_EQ(out.str(), c.utf8 + '|' + c.utf8);
+  }
+  std::ostringstream padded;
+  padded << std::setw(5) << UTF16String(u"1:00");
+  EXPECT_EQ(padded.str(), " 1:00");
+}
 
 TEST(UTF8to16, DecodesValidTextAndReplacesEachIllFormedSubsequenceOnce) {
   // clang-format off

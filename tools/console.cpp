@@ -6,8 +6,9 @@
 //                                                     of input or "quit"
 //   zebmediatypes-console help | --help
 //
-// Exit status: 0 on success, 2 for an unknown command or bad usage (in the
-// reading mode: when any line named an unknown command).
+// Exit status: 0 on success, 2 for an unknown command or bad usage (an empty
+// argument or one holding a blank; in the reading mode: when any line named an
+// unknown command).
 #include <unistd.h>
 #include <zebcore/console.h>
 #include <zebcore/initializer.h>
@@ -24,6 +25,7 @@ namespace {
 
 constexpr int kExitSuccess = 0;
 constexpr int kExitUsage = 2;
+constexpr std::string_view kBlanks = " \t\n\v\f\r";
 
 constexpr const char* kUsage =
     "usage: zebmediatypes-console [<command> [arguments...]]\n"
@@ -34,6 +36,9 @@ constexpr const char* kUsage =
     "\n"
     "  help        lists the registered commands with their help texts\n"
     "  --help      prints this text\n"
+    "\n"
+    "Arguments are passed on joined by blanks, so none may be empty or hold a\n"
+    "blank.\n"
     "\n"
     "Example:\n"
     "  zebmediatypes-console zebmediatypes.TimeToTimecode 1800 29.97 29.97 -d\n"
@@ -64,9 +69,42 @@ class LibrarySession {
   bool registeredHere_ = false;
 };
 
+constexpr std::size_t kHelpWidth = 80;
+constexpr std::u16string_view kHelpIndent = u"    ";
+
+// `text` broken at blanks into indented lines of at most kHelpWidth columns (a
+// longer word stands on a line of its own).
+void PrintWrapped(std::u16string_view text, zebcore::string::UTF16OStream& out) {
+  std::size_t column = 0;
+  while (!text.empty()) {
+    const std::size_t start = text.find_first_not_of(u' ');
+    if (start == std::u16string_view::npos) break;
+    text.remove_prefix(start);
+    const std::u16string_view word = text.substr(0, text.find(u' '));
+    text.remove_prefix(word.size());
+    if (column != 0 && column + 1 + word.size() > kHelpWidth) {
+      out << u"\n";
+      column = 0;
+    }
+    out << (column == 0 ? kHelpIndent : u" ") << word;
+    column += (column == 0 ? kHelpIndent.size() : 1) + word.size();
+  }
+  out << u"\n";
+}
+
+// Each command's name, then its help text wrapped: a help text that starts with
+// the command's usage ("<usage>- <description>") gets the usage on a line of its
+// own.
 void PrintHelp(zebcore::string::UTF16OStream& out) {
   for (const auto& entry : zebcore::console::CommandRegistry::Get().Commands()) {
-    out << entry.name << u"\n    " << entry.help << u"\n";
+    std::u16string_view help = zebcore::string::View(entry.help);
+    out << entry.name << u"\n";
+    const std::size_t dash = help.find(u"- ");
+    if (dash != std::u16string_view::npos && dash > 0 && help[dash - 1] != u' ') {
+      PrintWrapped(help.substr(0, dash), out);
+      help.remove_prefix(dash + 2);
+    }
+    PrintWrapped(help, out);
   }
   out.Flush();
 }
@@ -127,6 +165,18 @@ int main(int argc, char** argv) {
     if (first.size() > 1 && first[0] == '-') {
       std::cerr << "zebmediatypes-console: unknown option '" << first << "' (see --help)"
                 << std::endl;
+      return kExitUsage;
+    }
+  }
+  // The command line reaches a command as one text with its arguments joined
+  // by blanks, so an argument that is empty or holds a blank cannot be carried.
+  for (int i = 1; i < argc; ++i) {
+    const std::string_view argument = argv[i];
+    const bool empty = argument.empty();
+    if (empty || argument.find_first_of(kBlanks) != std::string_view::npos) {
+      std::cerr << "zebmediatypes-console: argument " << i
+                << (empty ? " is empty" : " holds a blank")
+                << " (arguments are joined by blanks, see --help)" << std::endl;
       return kExitUsage;
     }
   }

@@ -25,6 +25,7 @@
 #include <cmath>
 #include <cstdint>
 #include <iosfwd>
+#include <iterator>
 #include <limits>
 #include <string>
 #include <type_traits>
@@ -197,6 +198,28 @@ inline constexpr FrameRate kFrameRate_Audio96000{2646000};
 inline constexpr FrameRate kFrameRate_Audio192000{1323000};
 inline constexpr FrameRate kFrameRate_Invalid{std::numeric_limits<std::int64_t>::max()};
 
+namespace details {
+
+// The ten named audio sample rates, slowest first: the one list the library
+// keeps of them. The first nine are the native rates (audio_frame_rate_utils.h);
+// the last seven, from 22050 Hz, are the rates IsFrameRateAudio() accepts.
+inline constexpr FrameRate kAudioRateConstants[] = {
+    kFrameRate_Audio8000,  kFrameRate_Audio11025, kFrameRate_Audio16000, kFrameRate_Audio22050,
+    kFrameRate_Audio32000, kFrameRate_Audio44100, kFrameRate_Audio48000, kFrameRate_Audio88200,
+    kFrameRate_Audio96000, kFrameRate_Audio192000};
+static_assert(std::size(kAudioRateConstants) == 10);
+
+// Whether `rate` is one of the ten named audio rates kFrameRate_Audio8000 to
+// kFrameRate_Audio192000.
+constexpr bool IsAudioRateConstant(FrameRate rate) noexcept {
+  for (FrameRate r : kAudioRateConstants) {
+    if (r == rate) return true;
+  }
+  return false;
+}
+
+}  // namespace details
+
 // TickTime
 //
 // A point or span on the tick scale: a signed 64-bit tick count, 254016000000
@@ -221,6 +244,17 @@ class TickTime {
 
   constexpr std::int64_t GetTicks() const noexcept { return ticks_; }
   constexpr void SetTicks(std::int64_t ticks) noexcept { ticks_ = ticks; }
+  // FromSeconds()
+  //
+  // seconds * 254016000000 (one double product) rounded to the nearest tick,
+  // an exact half away from zero. NaN gives kTime_Invalid; values beyond the
+  // 64-bit range, infinities included, clamp to INT64_MIN / INT64_MAX like the
+  // other double conversions. FromSeconds(1.001) is 30 frames at
+  // kFrameRate_Video29_97, and every tick count of magnitude below 2^51 comes
+  // back from FromSeconds(t.ToSeconds()) unchanged (beyond it a double no
+  // longer holds every tick).
+  ZEBMEDIATYPES_API static TickTime FromSeconds(double seconds) noexcept;
+
   // ticks / 254016000000.
   constexpr double ToSeconds() const noexcept {
     return static_cast<double>(ticks_) / static_cast<double>(details::kTicksPerSecond);
@@ -354,7 +388,9 @@ class TickTime {
   // Rounds to the nearest frame boundary of `rate`, an exact half away from
   // zero, then clamps to [kTime_Min, kTime_Max] (times near the 64-bit limits
   // clamp to the bound on their side). Does nothing when `rate` is no rate. The
-  // only operation of this type that saturates.
+  // only operation of this type that clamps to [kTime_Min, kTime_Max]; the
+  // double conversions clamp only to the 64-bit range, and integer arithmetic
+  // wraps.
   constexpr TickTime& AlignToNearestFrame(FrameRate rate) noexcept;
 
   // CalculateFrameRate()
@@ -439,10 +475,6 @@ ZEBMEDIATYPES_API void PrintTo(TickTime time, std::ostream* out);
 ZEBMEDIATYPES_API void PrintTo(FrameRate rate, std::ostream* out);
 
 namespace details {
-
-// Whether `rate` is one of the ten named audio rates kFrameRate_Audio8000 to
-// kFrameRate_Audio192000.
-ZEBMEDIATYPES_API bool IsAudioRateConstant(FrameRate rate) noexcept;
 
 // ExplainTickTimeWithFrameRate()
 //

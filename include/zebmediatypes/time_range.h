@@ -24,9 +24,10 @@ class TimeRange {
   constexpr TimeRange() noexcept = default;
   // From a start and an end; either may be kTime_Invalid.
   constexpr TimeRange(TickTime start, TickTime end) noexcept : mStart(start), mEnd(end) {}
-  // From a start and a duration: end = start + duration, at most kTime_Max
-  // (the sum saturates instead of wrapping). When either is kTime_Invalid the
-  // end is kTime_Invalid.
+  // From a start and a duration: end = start + duration, capped above at
+  // kTime_Max. Below, the sum is not capped at kTime_Min: a negative sum keeps
+  // its value, and one beyond the 64-bit range gives INT64_MIN instead of
+  // wrapping. When either is kTime_Invalid the end is kTime_Invalid.
   constexpr TimeRange(TickTime start, Duration duration) noexcept
       : mStart(start), mEnd(SaturatingEnd(start, duration.value)) {}
 

@@ -21,7 +21,11 @@
 // TimeToTimecode wrote back as the same frame-aligned time, negative times
 // included when they are written with kTimecodeFlag_ShowSign (or in the frame
 // count and film displays, which carry their own sign), within the 24 hours
-// that the hours field holds (it wraps at 24).
+// that the hours field holds (it wraps at 24). kTimecodeFlag_OmitHours is the
+// exception: a text without its hours reads back modulo one hour.
+//
+// Display texts are zebcore::UTF16String; `std::cout << TimeToTimecode(...)`
+// prints them as UTF-8 (zebcore/string.h). The readers take UTF-16 or UTF-8.
 //
 // All functions are pure and thread-safe.
 #pragma once
@@ -34,6 +38,7 @@
 
 #include <boost/rational.hpp>
 #include <cstdint>
+#include <optional>
 #include <string_view>
 
 namespace zebmediatypes {
@@ -98,10 +103,13 @@ ZEBMEDIATYPES_API void TimeToHMSF(unsigned& hours, unsigned& minutes, unsigned& 
 //   - one to four fields of decimal digits separated by ':', ';' or '.' (any
 //     mix), assigned from the right: frames, seconds, minutes, hours. Empty
 //     fields are 0. Fields may exceed their range and are carried ("00:00:90:00"
-//     is 1:30); hours wrap at 24.
+//     is 1:30); hours wrap at 24. In the milliseconds display the frames field
+//     is a whole count of milliseconds, not a decimal fraction: "1.5" is 1 s
+//     and 5 ms, "1.500" is 1.5 s.
 //   - a single run of digits, split from the right into frames (as many digits
-//     as the display's frame count needs), then two digits each of seconds,
-//     minutes and hours: "1000" at 24 fps is 10 s, "24" is 24 frames.
+//     as the display's frame count needs; three in the milliseconds display),
+//     then two digits each of seconds, minutes and hours: "1000" at 24 fps is
+//     10 s, "24" is 24 frames.
 //   - a leading separator (":102") or kTimeDisplay_Frames: a raw frame count.
 //   - an optional leading '-' or '+'.
 //   - film displays: feet and frames split by one of ':', ';', '.', '+'
@@ -114,6 +122,24 @@ ZEBMEDIATYPES_API void TimeToHMSF(unsigned& hours, unsigned& minutes, unsigned& 
 ZEBMEDIATYPES_API TickTime TimecodeToTime(std::u16string_view text, FrameRate rate,
                                           TimeDisplay display = TimeDisplay(),
                                           zebcore::utility::Flags<unsigned int> flags = {});
+// The same for UTF-8 text: it reads as its UTF-16 conversion (an invalid
+// sequence becomes U+FFFD, which does not read).
+ZEBMEDIATYPES_API TickTime TimecodeToTime(std::string_view text, FrameRate rate,
+                                          TimeDisplay display = TimeDisplay(),
+                                          zebcore::utility::Flags<unsigned int> flags = {});
+
+// TryTimecodeToTime()
+//
+// TimecodeToTime that says when it failed: std::nullopt exactly where
+// TimecodeToTime gives kTime_Invalid for text that does not read. A text that
+// reads as -400000 s (the tick count of kTime_Invalid) is that value, not a
+// failure.
+ZEBMEDIATYPES_API std::optional<TickTime> TryTimecodeToTime(
+    std::u16string_view text, FrameRate rate, TimeDisplay display = TimeDisplay(),
+    zebcore::utility::Flags<unsigned int> flags = {});
+ZEBMEDIATYPES_API std::optional<TickTime> TryTimecodeToTime(
+    std::string_view text, FrameRate rate, TimeDisplay display = TimeDisplay(),
+    zebcore::utility::Flags<unsigned int> flags = {});
 
 // TimeToRatioTime() of TimecodeToTime(); text that does not read gives the
 // ratio of kTime_Invalid.

@@ -338,36 +338,47 @@ UTF8String ColorManagementSettings::ToSerializedString() const noexcept {
   }
 }
 
-ColorSpace ColorSpaceFromSerializedString(const UTF8String& text) noexcept {
-  ColorSpace result;
+std::optional<ColorSpace> TryColorSpaceFromSerializedString(const UTF8String& text) noexcept {
+  std::optional<ColorSpace> result;
   try {
-    if (std::optional<ColorSpace> read = ReadColorSpace(text)) {
-      result = std::move(*read);
-    } else {
-      LogUsageEvent("ColorSpaceFromSerializedStringFailed");
-      result = GetDefaultColorSpace();
-    }
+    result = ReadColorSpace(text);
   } catch (...) {
-    LogUsageEvent("ColorSpaceFromSerializedStringFailed");
-    try {
-      result = GetDefaultColorSpace();
-    } catch (...) {
-      result = ColorSpace();
-    }
+    return std::nullopt;
   }
-  try {
-    AddColorSpaceToCache(result);
-  } catch (...) {
-    // The result stands even when it could not be entered in the cache.
+  if (result) {
+    try {
+      AddColorSpaceToCache(*result);
+    } catch (...) {
+      // The result stands even when it could not be entered in the cache.
+    }
   }
   return result;
 }
 
-ColorManagementSettings ColorManagementSettingsFromSerializedString(
+ColorSpace ColorSpaceFromSerializedString(const UTF8String& text) noexcept {
+  if (std::optional<ColorSpace> read = TryColorSpaceFromSerializedString(text)) {
+    return std::move(*read);
+  }
+  LogUsageEvent("ColorSpaceFromSerializedStringFailed");
+  ColorSpace result;
+  try {
+    result = GetDefaultColorSpace();
+  } catch (...) {
+    result = ColorSpace();
+  }
+  try {
+    AddColorSpaceToCache(result);
+  } catch (...) {
+    // The default stands even when it could not be entered in the cache.
+  }
+  return result;
+}
+
+std::optional<ColorManagementSettings> TryColorManagementSettingsFromSerializedString(
     const UTF8String& text) noexcept {
   try {
     const JSONValue document = ParseDocument(text);
-    if (!document) return {};
+    if (!document) return std::nullopt;
     const JSONObject& object = *boost::any_cast<JSONObject>(document.get());
     GraphicsWhiteLuminance luminance = kGraphicsWhiteLuminance_100;
     LUTInterpolationMethod method = kLUTInterpolationMethod_TriLinear;
@@ -377,16 +388,25 @@ ColorManagementSettings ColorManagementSettingsFromSerializedString(
     if (!ReadEnumMember(object, kGraphicsWhiteLuminanceKey, luminance) ||
         !ReadEnumMember(object, kLUTInterpolationMethodKey, method) ||
         !ReadEnumMember(object, kColorManagementSystemKey, system)) {
-      return {};
+      return std::nullopt;
     }
     if (const boost::any* value = Member(object, kOCIOConfigurationFileKey)) {
       file = ReadString(*value);
     }
-    if (!ReadBoolMember(object, kAutoToneMapEnabledKey, toneMap)) return {};
+    if (!ReadBoolMember(object, kAutoToneMapEnabledKey, toneMap)) return std::nullopt;
     return ColorManagementSettings(luminance, method, file, system, toneMap);
   } catch (...) {
-    return {};
+    return std::nullopt;
   }
+}
+
+ColorManagementSettings ColorManagementSettingsFromSerializedString(
+    const UTF8String& text) noexcept {
+  if (std::optional<ColorManagementSettings> read =
+          TryColorManagementSettingsFromSerializedString(text)) {
+    return std::move(*read);
+  }
+  return {};
 }
 
 Guid AddColorSpaceToCache(const ColorSpace& space) {

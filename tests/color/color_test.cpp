@@ -219,6 +219,7 @@ TEST(ColorSpace, ReadsEachMemberByItsRule) {
     testing::ScopedUsageLogger logger;
     EXPECT_EQ(ReadSpace(text), expected);
     EXPECT_EQ(logger.Events().size(), expected == kFails ? 1u : 0u);
+    EXPECT_EQ(TryColorSpaceFromSerializedString(U8(text)).has_value(), expected != kFails);
   }
 }
 
@@ -266,7 +267,12 @@ TEST(ColorManagementSettings, ReadsEachMemberByItsRule) {
       {R"({"ocioConfigurationFile":{"a":1},"graphicsWhiteLuminance":300})", Settings(300, 0, "", 0, false)},
       {R"({"SerializerWrappedObject":{"graphicsWhiteLuminance":203,"autoToneMapEnabled":true}})", Settings(203, 0, "", 0, true)}};
   // clang-format on
-  for (const auto& [text, expected] : kCases) EXPECT_EQ(ReadSettings(text), expected) << text;
+  for (const auto& [text, expected] : kCases) {
+    SCOPED_TRACE(text);
+    EXPECT_EQ(ReadSettings(text), expected);
+    EXPECT_EQ(TryColorManagementSettingsFromSerializedString(U8(text)).has_value(),
+              !(expected == kFails));
+  }
 }
 
 TEST(ColorSerialization, BadInputGivesTheDefaultRecords) {
@@ -283,7 +289,18 @@ TEST(ColorSerialization, BadInputGivesTheDefaultRecords) {
     SCOPED_TRACE(text.substr(0, 60));
     EXPECT_EQ(ReadSpace(text), DefaultSpace());
     EXPECT_EQ(ReadSettings(text), ColorManagementSettings());
+    EXPECT_FALSE(TryColorSpaceFromSerializedString(U8(text)));
+    EXPECT_FALSE(TryColorManagementSettingsFromSerializedString(U8(text)));
   }
+}
+
+TEST(ColorSerialization, TryReadersTellTheDefaultReadFromAFailure) {
+  // The texts of the default records read as those records, not as failures.
+  const std::optional<ColorSpace> space =
+      TryColorSpaceFromSerializedString(DefaultSpace().ToSerializedString());
+  ASSERT_TRUE(space);
+  EXPECT_EQ(*space, DefaultSpace());
+  EXPECT_EQ(TryColorManagementSettingsFromSerializedString(U8("{}")), ColorManagementSettings());
 }
 
 TEST(ColorSpace, InvalidUtf8NameIsWrittenAsReplacementCharacters) {

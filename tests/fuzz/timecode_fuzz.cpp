@@ -14,6 +14,7 @@
 #include <cstdint>
 #include <cstring>
 #include <iterator>
+#include <optional>
 
 namespace media = zebmediatypes;
 
@@ -81,7 +82,16 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   } else {
     for (std::size_t i = 0; i < size; ++i) text += static_cast<char16_t>(data[i]);
   }
-  (void)media::TimecodeToTime(text, rate, display, flags);
+  // The Try reader fails exactly where the plain one gives kTime_Invalid, and
+  // the UTF-8 form of the same text reads alike.
+  const std::optional<media::TickTime> read = media::TryTimecodeToTime(text, rate, display, flags);
+  if (read.value_or(media::kTime_Invalid) != media::TimecodeToTime(text, rate, display, flags)) {
+    __builtin_trap();
+  }
+  const zebcore::UTF8String utf8 = zebcore::string::UTF16to8(text);
+  if (media::TryTimecodeToTime(zebcore::string::View(utf8), rate, display, flags) != read) {
+    __builtin_trap();
+  }
 
   std::int64_t ticks = 0;
   std::memcpy(&ticks, data, size < sizeof ticks ? size : sizeof ticks);

@@ -6,6 +6,9 @@
 
 #include <zebcore/string.h>
 
+#include <ostream>
+#include <string>
+
 #include "utf_internal.h"
 
 namespace zebcore::string {
@@ -140,3 +143,15 @@ UTF8String ToUTF8String(std::string_view bytes) {
 std::string ToStdString(const UTF8String& bytes) { return std::string(View(bytes)); }
 
 }  // namespace zebcore::string
+
+namespace zebcore::allocator {
+
+std::ostream& operator<<(std::ostream& out, const UTF16String& text) {
+  return out << string::UTF16toNarrow(string::View(text));
+}
+
+std::ostream& operator<<(std::ostream& out, const UTF8String& text) {
+  return out << string::View(text);
+}
+
+}  // namespace zebcore::allocator

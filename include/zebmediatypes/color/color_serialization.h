@@ -26,6 +26,8 @@
 #include <zebmediatypes/color/color_space.h>
 #include <zebmediatypes/export.h>
 
+#include <optional>
+
 namespace zebmediatypes {
 namespace color {
 
@@ -40,6 +42,15 @@ ColorSpaceFromSerializedString(const zebcore::UTF8String& text) noexcept;
 // Never throws.
 ZEBMEDIATYPES_API ColorManagementSettings
 ColorManagementSettingsFromSerializedString(const zebcore::UTF8String& text) noexcept;
+
+// The readers above, saying when they failed: std::nullopt exactly where they
+// fall back to the default (no usage event is logged then); otherwise the
+// value they give. A colour space read is entered in the cache as above.
+// Never throw.
+ZEBMEDIATYPES_API std::optional<ColorSpace> TryColorSpaceFromSerializedString(
+    const zebcore::UTF8String& text) noexcept;
+ZEBMEDIATYPES_API std::optional<ColorManagementSettings>
+TryColorManagementSettingsFromSerializedString(const zebcore::UTF8String& text) noexcept;
 
 // Enters `space` under its identifier, unless an entry is there already (the
 // first one stays), and returns the identifier. Fills the caller's memo. An

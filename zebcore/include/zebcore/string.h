@@ -14,6 +14,7 @@
 #include <zebcore/flags.h>
 
 #include <cstddef>
+#include <iosfwd>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -26,6 +27,19 @@ using UTF8String = std::basic_string<unsigned char, std::char_traits<unsigned ch
                                      allocator::STLAllocator<unsigned char>>;
 using UTF16StringVector = std::vector<UTF16String, allocator::STLAllocator<UTF16String>>;
 using UTF8StringVector = std::vector<UTF8String, allocator::STLAllocator<UTF8String>>;
+
+namespace allocator {
+
+// Both string types written to a narrow stream as UTF-8: a UTF16String
+// converted as by UTF16to8, a UTF8String byte for byte; the stream's width and
+// fill apply as to a std::string. They are declared here, in the namespace of
+// the strings' allocator, because that and std are the only namespaces that
+// argument-dependent lookup searches for these types: `std::cout << text`
+// finds them from any namespace, with no using-declaration.
+ZEBCORE_API std::ostream& operator<<(std::ostream& out, const UTF16String& text);
+ZEBCORE_API std::ostream& operator<<(std::ostream& out, const UTF8String& text);
+
+}  // namespace allocator
 
 namespace string {
 
