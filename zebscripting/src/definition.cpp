@@ -2,6 +2,7 @@
 #include <zebcore/logging.h>
 #include <zebscripting/definition.h>
 #include <zebscripting/factory.h>
+#include <zebscripting/script_context.h>
 #include <zebscripting/utils.h>
 
 #include <exception>
@@ -215,6 +216,7 @@ ScriptObjectPtr CreateScriptObject(int contextHandle, const char* className,
         std::string("no script class ") + (className != nullptr ? className : "(null)"));
     return nullptr;
   }
+  if (!ScriptContext::Exists(contextHandle)) return nullptr;
   ScriptObjectPtr object = definition->CreateInstance(contextHandle);
   if (object && initializer) initializer(object);
   return object;

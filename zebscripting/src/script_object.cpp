@@ -114,4 +114,12 @@ boost::intrusive_ptr<ScriptContext> ScriptContext::FromHandle(int handle) {
   return found != registry.contexts.end() ? found->second.Lock() : nullptr;
 }
 
+bool ScriptContext::Exists(int handle) {
+  if (handle == 0) return true;
+  ContextRegistry& registry = Contexts();
+  std::lock_guard<std::mutex> lock(registry.mutex);
+  const auto found = registry.contexts.find(handle);
+  return found != registry.contexts.end() && !found->second.Expired();
+}
+
 }  // namespace zebscripting

@@ -20,6 +20,8 @@ class ZEBSCRIPTING_API ScriptContext : public zebcore::utility::RefCountedObject
 
   // The live context of `handle`; null when there is none (any more).
   static boost::intrusive_ptr<ScriptContext> FromHandle(int handle);
+  // Whether the context of `handle` is alive (0, "no context", counts as alive).
+  static bool Exists(int handle);
 
  protected:
   ScriptContext();

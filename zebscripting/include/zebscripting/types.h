@@ -2,10 +2,11 @@
 // script, and how script values are converted to them.
 //
 // T is one of: bool, int, unsigned int, std::int64_t, float, double,
-// zebcore::UTF8String, zebcore::UTF16String, std::vector<int> and
-// ScriptObjectPtr. Both are built with a name (a parameter's name, or "" for a
-// setter's value), optionally a default used when the argument is missing,
-// and, for objects, optionally the class name the argument must have:
+// zebcore::UTF8String, zebcore::UTF16String, std::vector<int>, ScriptObjectPtr,
+// and ScriptValue (the argument untouched, for an item that takes more than
+// one kind of value and sorts it out itself; undefined when missing). Both are built with a name (a
+// parameter's name, or "" for a setter's value), optionally a default used when the argument is
+// missing, and, for objects, optionally the class name the argument must have:
 //
 //   ParameterType<std::int64_t>("value")
 //   ParameterType<unsigned int>("samplerate", 44100u)
@@ -61,7 +62,8 @@ enum class ValueType {
   kUTF8String,
   kUTF16String,
   kIntVector,
-  kObject
+  kObject,
+  kAny  // ScriptValue: the argument as script gave it, for items that sort it out themselves
 };
 
 // The engine-neutral conversions behind Validate and ToScript.
@@ -198,9 +200,16 @@ struct ValueTraits<ScriptObjectPtr> {
   static ScriptValue ToScript(const ScriptObjectPtr& value) { return ScriptValue(value); }
 };
 
+template <>
+struct ValueTraits<ScriptValue> {
+  static constexpr ValueType kType = ValueType::kAny;
+  static ScriptValue ToScript(const ScriptValue& value) { return value; }
+};
+
 template <class T>
 class PropertyType : public TypeDescription {
   static constexpr bool kIsObject = std::is_same_v<T, ScriptObjectPtr>;
+  static constexpr bool kIsAny = std::is_same_v<T, ScriptValue>;
 
  public:
   using ValueTypeT = T;
@@ -222,6 +231,9 @@ class PropertyType : public TypeDescription {
   // Argument `index` of `arguments` as a T, or ParameterErrorException.
   T Validate(std::size_t index, const ScriptArguments& arguments) const {
     const ScriptValue& value = arguments[index];
+    if constexpr (kIsAny) {
+      return value.IsUndefined() && HasDefault() ? defaultValue_ : value;
+    }
     if (value.IsNullish()) {
       if constexpr (kIsObject) {
         return {};
@@ -232,6 +244,8 @@ class PropertyType : public TypeDescription {
     }
     if constexpr (kIsObject) {
       return conversion::ToObject(value, index, GetClassName());
+    } else if constexpr (kIsAny) {
+      return value;
     } else {
       return ValueTraits<T>::FromScript(value, index);
     }

@@ -13,9 +13,10 @@ namespace utils {
 // CreateScriptObject()
 //
 // A new object of the registered class `className` for the script context
-// `contextHandle`, passed through `initializer` (which may be empty) before it
-// is returned. Null for a class that is not registered (logged). Exceptions of
-// the initializer pass through.
+// `contextHandle` (0 for none), passed through `initializer` (which may be
+// empty) before it is returned. Null for a class that is not registered
+// (logged) and for a context that is gone. Exceptions of the initializer pass
+// through. Callers must be ready for null.
 //
 //   return zebscripting::utils::CreateScriptObject(
 //       handle, TickTimeObject::GetClassname(), [&](const ScriptObjectPtr& object) {
