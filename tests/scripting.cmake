@@ -1,3 +1,8 @@
 # Scripting tests: the host, its JavaScript adapter and the script classes.
 zmt_add_script_test(script_time_objects scripting/time_objects_test.js)
 zmt_add_test(zebscripting_host_test SOURCES scripting/host_test.cpp)
+zmt_add_test(zebscripting_storm_test SOURCES scripting/binding_storm_test.cpp)
+target_link_options(zebscripting_storm_test PRIVATE "LINKER:--no-as-needed")
+target_compile_definitions(zebscripting_storm_test
+                           PRIVATE ZMT_SCRIPT_TEST_DIR="${CMAKE_CURRENT_SOURCE_DIR}/scripting")
+zmt_add_test(zebscripting_concurrency_test SOURCES scripting/concurrency_test.cpp CONCURRENT)
