@@ -47,10 +47,30 @@ const std::vector<Item>& Items() {
   return items;
 }
 
-constexpr const char* kHostile[] = {
-    "undefined", "null", "NaN", "Infinity", "-Infinity", "-0", "0", "1", "-1", "2.5",
-    "Math.pow(2, 31)", "Math.pow(2, 53) + 1", "Math.pow(2, 63)", "-Math.pow(2, 63)", "1e300",
-    "''", "'\\ud800'", "'12'", "'bgra'", "[]", "[100, 101]", "{}", "function () {}", "true"};
+constexpr const char* kHostile[] = {"undefined",
+                                    "null",
+                                    "NaN",
+                                    "Infinity",
+                                    "-Infinity",
+                                    "-0",
+                                    "0",
+                                    "1",
+                                    "-1",
+                                    "2.5",
+                                    "Math.pow(2, 31)",
+                                    "Math.pow(2, 53) + 1",
+                                    "Math.pow(2, 63)",
+                                    "-Math.pow(2, 63)",
+                                    "1e300",
+                                    "''",
+                                    "'\\ud800'",
+                                    "'12'",
+                                    "'bgra'",
+                                    "[]",
+                                    "[100, 101]",
+                                    "{}",
+                                    "function () {}",
+                                    "true"};
 constexpr std::size_t kHostileCount = sizeof(kHostile) / sizeof(kHostile[0]);
 
 // A value: a hostile literal, or one of the objects kept so far.
@@ -104,17 +124,16 @@ std::string BuildScript(const std::uint8_t* data, std::size_t size) {
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   if (size > 1 << 16) return 0;
   const bool isScript = size >= 2 && data[0] == '/' && data[1] == '/';
-  const std::string source = isScript ? std::string(reinterpret_cast<const char*>(data), size)
-                                      : BuildScript(data, size);
+  const std::string source =
+      isScript ? std::string(reinterpret_cast<const char*>(data), size) : BuildScript(data, size);
   const std::size_t before = zebscripting::ScriptObject::LiveObjectCount();
   {
     zebscripting::JavaScriptLimits limits;
     limits.memoryBytes = std::size_t{16} << 20;
     limits.timeoutSeconds = 1;
     const auto context = zebscripting::JavaScriptContext::Create(limits);
-    context->DefineFunction("print", [](const zebscripting::ScriptArguments&) {
-      return zebscripting::ScriptValue();
-    });
+    context->DefineFunction(
+        "print", [](const zebscripting::ScriptArguments&) { return zebscripting::ScriptValue(); });
     const zebscripting::JavaScriptResult result = context->Evaluate(source, "fuzz.js");
     if (!isScript && !result.ok && result.text == "uncaught non-Error") std::abort();
   }
