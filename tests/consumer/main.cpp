@@ -4,6 +4,7 @@
 #include <zebmediatypes/zebmediatypes.h>
 
 #include <iostream>
+#include <string>
 
 int main() {
   using namespace zebmediatypes;
