@@ -323,6 +323,9 @@ TEST(JavaScriptContext, HostileScriptsHitTheMemoryCapAndTheTimeLimit) {
       {"while (true) {}", "RangeError"},
       {"for (;;) { try { while (true) {} } catch (e) {} }", "RangeError"},
       {"(function f() { f(); })();", "RangeError"},
+      {"var b = []; Object.defineProperty(b, 0, {get: function () { for (;;) {} }}); b",
+       "RangeError"},
+      {"throw {toString: function () { for (;;) {} }};", "Error"},
   };
   for (const auto& c : cases) {
     SCOPED_TRACE(c.source);

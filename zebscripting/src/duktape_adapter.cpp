@@ -28,6 +28,7 @@
 #include <cstdint>
 #include <cstdlib>
 #include <cstring>
+#include <deque>
 #include <exception>
 #include <mutex>
 #include <new>
@@ -90,7 +91,7 @@ struct JavaScriptContext::Impl {
   std::vector<ClassInfo> classes;
   std::unordered_map<std::string_view, std::size_t> classByName;
   std::vector<BoundItem> items;
-  std::vector<NativeFunction> functions;
+  std::deque<NativeFunction> functions;  // stable: a function may define another
   std::unordered_map<const ScriptObject*, void*> wrappers;
   void* basePrototype = nullptr;
   void* proxyHandler = nullptr;
@@ -805,6 +806,27 @@ void ReadError(duk_context* ctx, JavaScriptResult& result) {
   }
 }
 
+struct ResultReader {
+  Impl* impl;
+  JavaScriptResult* result;
+};
+
+// The completion value at index 0.
+duk_ret_t ReadValue(duk_context* ctx, void* udata) {
+  auto& reader = *static_cast<ResultReader*>(udata);
+  reader.result->value = GetValue(ctx, *reader.impl, 0);
+  duk_dup(ctx, 0);
+  duk_safe_to_string(ctx, -1);
+  reader.result->text = ToUTF8Text(ctx, -1);
+  return 0;
+}
+
+// The thrown value at index 0.
+duk_ret_t ReadErrorValue(duk_context* ctx, void* udata) {
+  ReadError(ctx, *static_cast<ResultReader*>(udata)->result);
+  return 0;
+}
+
 }  // namespace
 
 JavaScriptContext::Impl::~Impl() {
@@ -850,18 +872,22 @@ JavaScriptResult JavaScriptContext::Evaluate(std::string_view source, std::strin
   duk_push_lstring(ctx, fileName.data(), fileName.size());
   duk_int_t status = duk_pcompile(ctx, 0);
   if (status == DUK_EXEC_SUCCESS) status = duk_pcall(ctx, 0);
-  if (outer) impl_->timing = false;
+  // Reading the outcome may run script (getters, toString), so it runs
+  // protected and still under the time limit.
+  ResultReader reader{impl_.get(), &result};
   if (status == DUK_EXEC_SUCCESS) {
     result.ok = true;
-    result.value = GetValue(ctx, *impl_, -1);
-    duk_dup(ctx, -1);
-    duk_safe_to_string(ctx, -1);
-    result.text = ToUTF8Text(ctx, -1);
-    duk_pop(ctx);
-  } else {
-    ReadError(ctx, result);
+    if (duk_safe_call(ctx, ReadValue, &reader, 1, 1) != DUK_EXEC_SUCCESS) {
+      result = JavaScriptResult();
+      result.errorName = "RangeError";
+      result.text = "the script's value could not be read";
+    }
+  } else if (duk_safe_call(ctx, ReadErrorValue, &reader, 1, 1) != DUK_EXEC_SUCCESS) {
+    result.errorName = "Error";
+    result.text = "the error could not be read";
   }
   duk_pop(ctx);
+  if (outer) impl_->timing = false;
   return result;
 }
 
