@@ -354,6 +354,32 @@ TEST(JavaScriptContext, StringsCrossUnitForUnit) {
   EXPECT_EQ(context->Evaluate("'\xF0\x9F\x98\x80'.length", "utf8.js").text, "2");
 }
 
+TEST(ScriptContext, StaticItemsMakeTheirObjectsInTheCallingContext) {
+  const auto context = JavaScriptContext::Create();
+  std::vector<ScriptObjectPtr> made;
+  context->DefineFunction("capture", [&made](const ScriptArguments& arguments) {
+    made.push_back(arguments[0].GetObject());
+    return ScriptValue();
+  });
+  const auto result = context->Evaluate(
+      "var Z = zebmediatypes; capture(Z.TickTime.TIME_ONE_HOUR);"
+      "capture(Z.FrameRate.createWithValue(25)); capture(RatioTime.createRatioTime(1, 2));"
+      "capture(Z.TickTime.timecodeToTime('1', null, null)); capture(new Z.TimeDisplay());",
+      "context.js");
+  ASSERT_TRUE(result.ok) << result.text;
+  ASSERT_EQ(made.size(), 5u);
+  for (const ScriptObjectPtr& object : made) {
+    SCOPED_TRACE(object->GetClassName());
+    EXPECT_EQ(object->GetContextHandle(), context->GetHandle());
+  }
+  const ScriptObjectPtr rate =
+      zebscripting::utility::TransformObjectIntoScriptingObject<zebmediatypes::FrameRate>()(
+          zebmediatypes::kFrameRate_Video25, context->GetHandle());
+  zebmediatypes::FrameRate back;
+  EXPECT_TRUE(zebscripting::CastScriptObject(rate, back));
+  EXPECT_EQ(back, zebmediatypes::kFrameRate_Video25);
+}
+
 TEST(ScriptContext, ObjectsAreNotMadeForAContextThatIsGone) {
   int handle = 0;
   {

@@ -228,6 +228,7 @@ std::string ToUTF8Text(duk_context* ctx, duk_idx_t index) {
 // Throws into the engine; the file and line are those of the calling script.
 [[noreturn]] void Throw(duk_context* ctx, const PendingError& error) {
   duk_error_raw(ctx, error.code, nullptr, 0, "%s", error.message.c_str());
+  std::abort();  // not reached: the engine throws
 }
 
 PendingError ErrorFromException(const std::string& label) {
