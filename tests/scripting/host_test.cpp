@@ -407,3 +407,26 @@ TEST(ScriptObject, TimeHashesAreFnv1aOfTheValueBytes) {
 }
 
 }  // namespace
+
+namespace {
+
+TEST(RefCountedObjectWithWeakPtr, WeakPointersSeeTheObjectUntilItGoes) {
+  zebcore::utility::WeakPtr<ScriptObject> weak;
+  {
+    const ScriptObjectPtr time = zebmediatypes::scripting::CreateTickTimeObject({}, 0);
+    weak = zebcore::utility::WeakPtr<ScriptObject>(time.get());
+    EXPECT_EQ(weak.Lock(), time);
+    EXPECT_EQ(time->UseCount(), 1u);
+    time->LockObject();
+    time->LockObject();
+    EXPECT_EQ(time->UseCount(), 3u);
+    time->UnlockObject();
+    time->UnlockObject();
+    time->UnlockObject();  // one too many: ignored
+    EXPECT_EQ(time->UseCount(), 1u);
+  }
+  EXPECT_TRUE(weak.Expired());
+  EXPECT_EQ(weak.Lock(), nullptr);
+}
+
+}  // namespace
