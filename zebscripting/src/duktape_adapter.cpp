@@ -91,8 +91,10 @@ struct JavaScriptContext::Impl {
   std::vector<ClassInfo> classes;
   std::unordered_map<std::string_view, std::size_t> classByName;
   std::vector<BoundItem> items;
-  std::deque<NativeFunction> functions;  // stable: a function may define another
-  std::unordered_map<const ScriptObject*, void*> wrappers;
+  std::deque<NativeFunction> functions;                     // stable: a function may define another
+  std::unordered_map<const ScriptObject*, void*> wrappers;  // native -> holder
+  // Holder and proxy -> native: the receiver of an item call in one lookup.
+  std::unordered_map<const void*, ScriptObject*> natives;
   void* basePrototype = nullptr;
   void* proxyHandler = nullptr;
 
@@ -280,7 +282,10 @@ void PushObject(duk_context* ctx, Impl& impl, ScriptObject* object) {
     duk_dup(ctx, -1);
     duk_put_prop_literal(ctx, -3, kProxyKey);
   }
-  impl.wrappers.emplace(object, duk_get_heapptr(ctx, indexed ? -2 : -1));
+  void* const holder = duk_get_heapptr(ctx, indexed ? -2 : -1);
+  impl.wrappers.emplace(object, holder);
+  impl.natives.emplace(holder, object);
+  if (indexed) impl.natives.emplace(duk_get_heapptr(ctx, -1), object);
   object->AddRef();
   if (indexed) duk_remove(ctx, -2);
 }
@@ -308,6 +313,8 @@ ScriptValue GetValue(duk_context* ctx, Impl& impl, duk_idx_t index, int depth = 
     }
     case DUK_TYPE_OBJECT: {
       index = duk_require_normalize_index(ctx, index);
+      const auto known = impl.natives.find(duk_get_heapptr(ctx, index));
+      if (known != impl.natives.end()) return ScriptValue(ScriptObjectPtr(known->second));
       if (duk_is_function(ctx, index)) return ScriptValue::Other("function");
       if (duk_is_array(ctx, index)) {
         if (depth > 0) return ScriptValue::Other("nested array");
@@ -369,9 +376,15 @@ void PushValue(duk_context* ctx, Impl& impl, const ScriptValue& value) {
   duk_push_undefined(ctx);
 }
 
-// The native object of `this`, or a TypeError.
-ScriptObject* ThisObject(duk_context* ctx, const std::string& label) {
+// The native object of `this`, or a TypeError. A wrapper is found by its heap
+// address; an object that merely inherits from one through its hidden key.
+ScriptObject* ThisObject(duk_context* ctx, Impl& impl, const std::string& label) {
   duk_push_this(ctx);
+  const auto known = impl.natives.find(duk_get_heapptr(ctx, -1));
+  if (known != impl.natives.end()) {
+    duk_pop(ctx);
+    return known->second;
+  }
   duk_get_prop_literal(ctx, -1, kNativeKey);
   auto* object = static_cast<ScriptObject*>(duk_get_pointer(ctx, -1));
   duk_pop_2(ctx);
@@ -408,7 +421,7 @@ duk_ret_t ItemGetter(duk_context* ctx) {
   const BoundItem& bound = impl.items[static_cast<std::size_t>(duk_get_current_magic(ctx))];
   ScriptCall call;
   call.contextHandle = impl.owner->GetHandle();
-  if (!bound.item->IsStatic()) call.self = ThisObject(ctx, bound.label);
+  if (!bound.item->IsStatic()) call.self = ThisObject(ctx, impl, bound.label);
   ScriptValue result;
   PendingError error;
   if (!RunNative(
@@ -427,7 +440,7 @@ duk_ret_t ItemSetter(duk_context* ctx) {
   }
   ScriptCall call;
   call.contextHandle = impl.owner->GetHandle();
-  call.self = ThisObject(ctx, bound.label);
+  call.self = ThisObject(ctx, impl, bound.label);
   const ScriptValue value = GetValue(ctx, impl, 0);
   call.arguments = ScriptArguments(&value, 1);
   bool taken = false;
@@ -444,7 +457,7 @@ duk_ret_t ItemMethod(duk_context* ctx) {
   const BoundItem& bound = impl.items[static_cast<std::size_t>(duk_get_current_magic(ctx))];
   ScriptCall call;
   call.contextHandle = impl.owner->GetHandle();
-  if (!bound.item->IsStatic()) call.self = ThisObject(ctx, bound.label);
+  if (!bound.item->IsStatic()) call.self = ThisObject(ctx, impl, bound.label);
   const std::vector<ScriptValue> arguments = Arguments(ctx, impl);
   call.arguments = ScriptArguments(arguments);
   ScriptValue result;
@@ -492,7 +505,7 @@ duk_ret_t ClassConstructor(duk_context* ctx) {
 duk_ret_t BaseIsEqual(duk_context* ctx) {
   Impl& impl = GetImpl(ctx);
   static const std::string label = "isEqual";
-  ScriptObject* self = ThisObject(ctx, label);
+  ScriptObject* self = ThisObject(ctx, impl, label);
   const ScriptValue other = GetValue(ctx, impl, 0);
   bool equal = false;
   PendingError error;
@@ -524,6 +537,9 @@ duk_ret_t Finalize(duk_context* ctx) {
   const auto known = impl.wrappers.find(object);
   if (known != impl.wrappers.end() && known->second == duk_get_heapptr(ctx, 0)) {
     impl.wrappers.erase(known);
+    impl.natives.erase(duk_get_heapptr(ctx, 0));
+    if (duk_get_prop_literal(ctx, 0, kProxyKey)) impl.natives.erase(duk_get_heapptr(ctx, -1));
+    duk_pop(ctx);
     object->Release();
   }
   duk_push_pointer(ctx, nullptr);
