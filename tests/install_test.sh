@@ -1,8 +1,8 @@
 #!/usr/bin/env bash
 # The installed package where it ends up: installs the build into a scratch
 # prefix, moves the prefix, then with no LD_LIBRARY_PATH runs the console
-# program from it, checks the RUNPATH and pkg-config file, and builds and runs
-# tests/consumer against it.
+# program and the example script from it, checks the RUNPATH and pkg-config
+# file, and builds and runs tests/consumer against it.
 #   install_test.sh <build dir> <source dir> <C++ compiler> <bindir> <libdir>
 set -euo pipefail
 build=$1 source=$2 cxx=$3 bindir=$4 libdir=$5
@@ -16,7 +16,9 @@ unset LD_LIBRARY_PATH
 
 out=$("$prefix/$bindir/zebmediatypes-console" zebmediatypes.TimeToTimecode 1800 29.97 29.97 -d)
 [[ $out == *"is: 00;01;00;02" ]] || { echo "FAIL: console from the moved prefix said '$out'"; exit 1; }
-for file in "$prefix/$libdir/libzebmediatypes.so" "$prefix/$libdir/libzebcore.so"; do
+out=$("$prefix/$bindir/zebmediatypes-script" "$prefix/share/zebmediatypes/examples/time.js")
+[[ $out == *"timecode 00;01;00;02"* ]] || { echo "FAIL: the example script said '$out'"; exit 1; }
+for file in "$prefix/$libdir"/lib{zebmediatypes,zebscripting,zebcore}.so "$prefix/$bindir/zebmediatypes-script"; do
   readelf -d "$file" | grep -q 'RUNPATH.*\[\$ORIGIN' || { echo "FAIL: $file has no \$ORIGIN RUNPATH"; exit 1; }
 done
 
