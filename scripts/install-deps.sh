@@ -10,6 +10,7 @@ packages=(
   libgtest-dev libgmock-dev libbenchmark-dev
   clang-14 libclang-rt-14-dev libfuzzer-14-dev
   libavutil-dev libswresample-dev
+  duktape-dev
 )
 
 missing=()

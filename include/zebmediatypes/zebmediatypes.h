@@ -41,3 +41,4 @@
 #include <zebmediatypes/color/rgba.h>
 #include <zebmediatypes/initialization.h>
 #include <zebmediatypes/mime_types.h>
+#include <zebmediatypes/scripting/time_objects.h>
