@@ -1,5 +1,6 @@
 # Scripting tests: the host, its JavaScript adapter and the script classes.
 zmt_add_script_test(script_time_objects scripting/time_objects_test.js)
+zmt_add_test(zebscripting_host_test SOURCES scripting/host_test.cpp)
 
 # The audio, video and colour classes: script tables and edge cases, native
 # tables, definitions and lifetimes, and the held layout under threads.

@@ -531,6 +531,12 @@ duk_ret_t Finalize(duk_context* ctx) {
 
 // A canonical integer key ("0", "-1", "42"; not "01", "1.0", "+1").
 bool IndexFromKey(duk_context* ctx, duk_idx_t key, double& index) {
+  if (duk_is_number(ctx, key)) {  // the engine passes array-index keys as numbers
+    const double value = duk_get_number(ctx, key);
+    if (std::trunc(value) != value) return false;
+    index = value == 0 ? 0.0 : value;
+    return true;
+  }
   if (!duk_is_string(ctx, key)) return false;
   duk_size_t size = 0;
   const char* text = duk_get_lstring(ctx, key, &size);
@@ -593,6 +599,12 @@ duk_ret_t NativeCall(duk_context* ctx) {
     Throw(ctx, error);
   }
   PushValue(ctx, impl, result);
+  return 1;
+}
+
+// Returns its magic number.
+duk_ret_t PlainNumber(duk_context* ctx) {
+  duk_push_int(ctx, duk_get_current_magic(ctx));
   return 1;
 }
 
@@ -760,8 +772,9 @@ duk_ret_t SetUpHeap(duk_context* ctx, void* udata) {
     }
     duk_pop_2(ctx);  // prototype, constructor
   }
+  duk_dup(ctx, keep);
   duk_put_prop_literal(ctx, stash, kStashPrototypes);
-  duk_pop_2(ctx);  // base, stash
+  duk_pop_3(ctx);  // base, keep, stash
   return 0;
 }
 
@@ -868,6 +881,16 @@ void JavaScriptContext::DefineGlobal(const char* name, const ScriptValue& value)
   duk_context* ctx = impl_->ctx;
   duk_push_global_object(ctx);
   PushValue(ctx, *impl_, value);
+  duk_put_prop_string(ctx, -2, name);
+  duk_pop(ctx);
+}
+
+void JavaScriptContext::DefinePlainNumberFunction(const char* name, int value) {
+  std::lock_guard<std::recursive_mutex> lock(impl_->mutex);
+  duk_context* ctx = impl_->ctx;
+  duk_push_global_object(ctx);
+  duk_push_c_function(ctx, PlainNumber, 0);
+  duk_set_magic(ctx, -1, value < -32768 ? -32768 : value > 32767 ? 32767 : value);
   duk_put_prop_string(ctx, -2, name);
   duk_pop(ctx);
 }

@@ -73,6 +73,10 @@ class ZEBSCRIPTING_API JavaScriptContext final : public ScriptContext {
   // Defines a global function or value.
   void DefineFunction(const char* name, NativeFunction function);
   void DefineGlobal(const char* name, const ScriptValue& value);
+  // Defines a global function that returns `value` (-32768 to 32767, clamped)
+  // straight from the engine, without the host's argument and result
+  // conversions: the engine's own cost of a native call, for comparisons.
+  void DefinePlainNumberFunction(const char* name, int value);
 
   // Runs a full garbage collection (finalizing unreachable wrappers).
   void CollectGarbage();
