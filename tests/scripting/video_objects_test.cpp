@@ -50,7 +50,7 @@ TEST(PixelFormatObject, FourCCTextShowsOnlyPrintableBytes) {
   const Case kCases[] = {
       {MakePixelFormatName("bgra"), "bgra"},
       {0, "    "},
-      {0x1F7F2080u, "  \x7F "},
+      {0x1F7F2080u, "? \x7F "},
       {0xFF80417Eu, "~A??"},
       {0xFFFFFFFFu, "????"},
   };
