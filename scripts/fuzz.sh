@@ -12,7 +12,7 @@ passed=0
 while read -r name exe corpus; do
   [ -n "$name" ] || continue
   work=$(mktemp -d)
-  [ -d "$corpus" ] && cp -r "$corpus"/. "$work"/
+  [ -d "$corpus" ] && cp -rL "$corpus"/. "$work"/
   echo "fuzz: $name for ${seconds}s"
   ASAN_OPTIONS=detect_leaks=1 "$exe" -max_total_time="$seconds" -timeout=10 -rss_limit_mb=2048 \
     -print_final_stats=0 "$work" 2> "$work.log" || { tail -50 "$work.log"; echo "fuzz: $name FAILED"; exit 1; }

@@ -6,8 +6,9 @@
 #      fuzz target for a short, bounded time (ZMT_FUZZ_SECONDS, default 30);
 #   3. g++ ThreadSanitizer build: the tests that exercise shared state;
 #   4. g++ optimized build, warnings as errors: the exhaustive sweeps, the
-#      benchmarks built (not run), the tools, install, and the consumer project
-#      built against the install.
+#      benchmarks built (not run), the tools, install, the consumer project
+#      built against the install, and the installed script runner running the
+#      example script.
 # Build folders live under build/ (ZMT_BUILD_ROOT to move them).
 set -euo pipefail
 cd "$(dirname "$0")/.."
@@ -52,5 +53,6 @@ cmake --install "$out/release" >/dev/null
 cmake -S "$root/tests/consumer" -B "$out/consumer" -DCMAKE_PREFIX_PATH="$out/install" >/dev/null
 cmake --build "$out/consumer" -j "$jobs"
 LD_LIBRARY_PATH="$out/install/lib" "$out/consumer/zebmediatypes-consumer"
+"$out/install/bin/zebmediatypes-script" "$out/install/share/zebmediatypes/examples/time.js"
 
 step "All checks passed"

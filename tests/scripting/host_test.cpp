@@ -319,7 +319,7 @@ TEST(JavaScriptContext, HostileScriptsHitTheMemoryCapAndTheTimeLimit) {
     const char* source;
     const char* errorName;
   } cases[] = {
-      {"var a = []; while (true) a.push(new Array(1000).join('x'));", "RangeError"},
+      {"var a = [], s = 'x'; while (true) { s += s; a.push(s + a.length); }", "Error"},
       {"while (true) {}", "RangeError"},
       {"for (;;) { try { while (true) {} } catch (e) {} }", "RangeError"},
       {"(function f() { f(); })();", "RangeError"},

@@ -1,0 +1,1 @@
+../../../scripting/time_objects_test.js
