@@ -86,7 +86,7 @@ void AudioChannelLayoutObject::DefineObject() {
   definition.AddProperty(def::ElementCount(PropertyType<int>(), &Self::GetLength,
                                            "Number of audio channels.", kItemFlag_Host));
   definition.AddProperty(def::IndexedGetter(PropertyType<int>(), &Self::GetByIndex,
-                                            ParameterType<int>("index"),
+                                            ParameterType<std::int64_t>("index"),
                                             "Returns an audio channel label.", kItemFlag_Host));
   definition.AddProperty(def::Property("description", PropertyType<zebcore::UTF16String>(),
                                        &Self::GetLayoutDescription,
@@ -154,8 +154,8 @@ int AudioChannelLayoutObject::GetLength() const noexcept {
   return static_cast<int>(std::min<std::size_t>(layout_.size(), INT_MAX));
 }
 
-int AudioChannelLayoutObject::GetByIndex(int index) const noexcept {
-  if (index < 0 || static_cast<std::size_t>(index) >= layout_.size()) return -1;
+int AudioChannelLayoutObject::GetByIndex(std::int64_t index) const noexcept {
+  if (index < 0 || static_cast<std::uint64_t>(index) >= layout_.size()) return -1;
   return LabelToInt(layout_[static_cast<std::size_t>(index)].label);
 }
 

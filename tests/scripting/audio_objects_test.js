@@ -89,7 +89,7 @@ expectEqual(labelsOf(Layout.createCommonAudioChannelLayout(4)), "100 101 102 103
   expectEqual(Layout.createAudioChannelLayout(c[0]).isEqual(stereo), c[1], "isEqual " + c[0]);
 });
 expectEqual(Layout.createAudioChannelLayout([]), null, "empty label array");
-[-1, 2, -2147483648, 2147483647].forEach(function (index) {
+[-1, 2, -2147483649, 2147483648, Math.pow(2, 53)].forEach(function (index) {
   expectEqual(stereo[index], -1, "stereo[" + index + "]");
 });
 expectEqual(labelsOf(Layout.createAudioChannelLayout([5, -1, 2147483647])), "5 -1 2147483647",

@@ -72,8 +72,8 @@ class ZEBMEDIATYPES_API AudioChannelLayoutObject : public zebscripting::ScriptOb
   // The channel count (at most INT_MAX).
   int GetLength() const noexcept;
   // The label value of channel `index` as a signed 32-bit integer, -1 outside
-  // [0, count).
-  int GetByIndex(int index) const noexcept;
+  // [0, count) (any 64-bit index: `layout[2 ** 40]` reads -1 too).
+  int GetByIndex(std::int64_t index) const noexcept;
   zebcore::UTF16String GetLayoutDescription() const;
 
   static zebcore::UTF16String GetLabel(int contextHandle, int label);
