@@ -323,6 +323,9 @@ TEST(JavaScriptContext, HostileScriptsHitTheMemoryCapAndTheTimeLimit) {
       {"while (true) {}", "RangeError"},
       {"for (;;) { try { while (true) {} } catch (e) {} }", "RangeError"},
       {"(function f() { f(); })();", "RangeError"},
+      {"var b = []; Object.defineProperty(b, 0, {get: function () { for (;;) {} }}); b",
+       "RangeError"},
+      {"throw {toString: function () { for (;;) {} }};", "Error"},
   };
   for (const auto& c : cases) {
     SCOPED_TRACE(c.source);
@@ -351,6 +354,32 @@ TEST(JavaScriptContext, StringsCrossUnitForUnit) {
   EXPECT_EQ(context->Evaluate("'\xF0\x9F\x98\x80'.length", "utf8.js").text, "2");
 }
 
+TEST(ScriptContext, StaticItemsMakeTheirObjectsInTheCallingContext) {
+  const auto context = JavaScriptContext::Create();
+  std::vector<ScriptObjectPtr> made;
+  context->DefineFunction("capture", [&made](const ScriptArguments& arguments) {
+    made.push_back(arguments[0].GetObject());
+    return ScriptValue();
+  });
+  const auto result = context->Evaluate(
+      "var Z = zebmediatypes; capture(Z.TickTime.TIME_ONE_HOUR);"
+      "capture(Z.FrameRate.createWithValue(25)); capture(RatioTime.createRatioTime(1, 2));"
+      "capture(Z.TickTime.timecodeToTime('1', null, null)); capture(new Z.TimeDisplay());",
+      "context.js");
+  ASSERT_TRUE(result.ok) << result.text;
+  ASSERT_EQ(made.size(), 5u);
+  for (const ScriptObjectPtr& object : made) {
+    SCOPED_TRACE(object->GetClassName());
+    EXPECT_EQ(object->GetContextHandle(), context->GetHandle());
+  }
+  const ScriptObjectPtr rate =
+      zebscripting::utility::TransformObjectIntoScriptingObject<zebmediatypes::FrameRate>()(
+          zebmediatypes::kFrameRate_Video25, context->GetHandle());
+  zebmediatypes::FrameRate back;
+  EXPECT_TRUE(zebscripting::CastScriptObject(rate, back));
+  EXPECT_EQ(back, zebmediatypes::kFrameRate_Video25);
+}
+
 TEST(ScriptContext, ObjectsAreNotMadeForAContextThatIsGone) {
   int handle = 0;
   {
@@ -375,6 +404,29 @@ TEST(ScriptObject, TimeHashesAreFnv1aOfTheValueBytes) {
             scripting::CreateTimeDisplayObject(TimeDisplay::CreateCustom(30), nullptr)->Hash());
   EXPECT_FALSE(
       display->IsEqual(scripting::CreateTimeDisplayObject(TimeDisplay::CreateCustom(30), nullptr)));
+}
+
+}  // namespace
+
+namespace {
+
+TEST(RefCountedObjectWithWeakPtr, WeakPointersSeeTheObjectUntilItGoes) {
+  zebcore::utility::WeakPtr<ScriptObject> weak;
+  {
+    const ScriptObjectPtr time = zebmediatypes::scripting::CreateTickTimeObject({}, 0);
+    weak = zebcore::utility::WeakPtr<ScriptObject>(time.get());
+    EXPECT_EQ(weak.Lock(), time);
+    EXPECT_EQ(time->UseCount(), 1u);
+    time->LockObject();
+    time->LockObject();
+    EXPECT_EQ(time->UseCount(), 3u);
+    time->UnlockObject();
+    time->UnlockObject();
+    time->UnlockObject();  // one too many: ignored
+    EXPECT_EQ(time->UseCount(), 1u);
+  }
+  EXPECT_TRUE(weak.Expired());
+  EXPECT_EQ(weak.Lock(), nullptr);
 }
 
 }  // namespace

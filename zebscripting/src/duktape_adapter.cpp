@@ -28,6 +28,7 @@
 #include <cstdint>
 #include <cstdlib>
 #include <cstring>
+#include <deque>
 #include <exception>
 #include <mutex>
 #include <new>
@@ -90,8 +91,10 @@ struct JavaScriptContext::Impl {
   std::vector<ClassInfo> classes;
   std::unordered_map<std::string_view, std::size_t> classByName;
   std::vector<BoundItem> items;
-  std::vector<NativeFunction> functions;
-  std::unordered_map<const ScriptObject*, void*> wrappers;
+  std::deque<NativeFunction> functions;                     // stable: a function may define another
+  std::unordered_map<const ScriptObject*, void*> wrappers;  // native -> holder
+  // Holder and proxy -> native: the receiver of an item call in one lookup.
+  std::unordered_map<const void*, ScriptObject*> natives;
   void* basePrototype = nullptr;
   void* proxyHandler = nullptr;
 
@@ -227,6 +230,7 @@ std::string ToUTF8Text(duk_context* ctx, duk_idx_t index) {
 // Throws into the engine; the file and line are those of the calling script.
 [[noreturn]] void Throw(duk_context* ctx, const PendingError& error) {
   duk_error_raw(ctx, error.code, nullptr, 0, "%s", error.message.c_str());
+  std::abort();  // not reached: the engine throws
 }
 
 PendingError ErrorFromException(const std::string& label) {
@@ -278,7 +282,10 @@ void PushObject(duk_context* ctx, Impl& impl, ScriptObject* object) {
     duk_dup(ctx, -1);
     duk_put_prop_literal(ctx, -3, kProxyKey);
   }
-  impl.wrappers.emplace(object, duk_get_heapptr(ctx, indexed ? -2 : -1));
+  void* const holder = duk_get_heapptr(ctx, indexed ? -2 : -1);
+  impl.wrappers.emplace(object, holder);
+  impl.natives.emplace(holder, object);
+  if (indexed) impl.natives.emplace(duk_get_heapptr(ctx, -1), object);
   object->AddRef();
   if (indexed) duk_remove(ctx, -2);
 }
@@ -306,6 +313,8 @@ ScriptValue GetValue(duk_context* ctx, Impl& impl, duk_idx_t index, int depth = 
     }
     case DUK_TYPE_OBJECT: {
       index = duk_require_normalize_index(ctx, index);
+      const auto known = impl.natives.find(duk_get_heapptr(ctx, index));
+      if (known != impl.natives.end()) return ScriptValue(ScriptObjectPtr(known->second));
       if (duk_is_function(ctx, index)) return ScriptValue::Other("function");
       if (duk_is_array(ctx, index)) {
         if (depth > 0) return ScriptValue::Other("nested array");
@@ -367,9 +376,15 @@ void PushValue(duk_context* ctx, Impl& impl, const ScriptValue& value) {
   duk_push_undefined(ctx);
 }
 
-// The native object of `this`, or a TypeError.
-ScriptObject* ThisObject(duk_context* ctx, const std::string& label) {
+// The native object of `this`, or a TypeError. A wrapper is found by its heap
+// address; an object that merely inherits from one through its hidden key.
+ScriptObject* ThisObject(duk_context* ctx, Impl& impl, const std::string& label) {
   duk_push_this(ctx);
+  const auto known = impl.natives.find(duk_get_heapptr(ctx, -1));
+  if (known != impl.natives.end()) {
+    duk_pop(ctx);
+    return known->second;
+  }
   duk_get_prop_literal(ctx, -1, kNativeKey);
   auto* object = static_cast<ScriptObject*>(duk_get_pointer(ctx, -1));
   duk_pop_2(ctx);
@@ -406,7 +421,7 @@ duk_ret_t ItemGetter(duk_context* ctx) {
   const BoundItem& bound = impl.items[static_cast<std::size_t>(duk_get_current_magic(ctx))];
   ScriptCall call;
   call.contextHandle = impl.owner->GetHandle();
-  if (!bound.item->IsStatic()) call.self = ThisObject(ctx, bound.label);
+  if (!bound.item->IsStatic()) call.self = ThisObject(ctx, impl, bound.label);
   ScriptValue result;
   PendingError error;
   if (!RunNative(
@@ -425,7 +440,7 @@ duk_ret_t ItemSetter(duk_context* ctx) {
   }
   ScriptCall call;
   call.contextHandle = impl.owner->GetHandle();
-  call.self = ThisObject(ctx, bound.label);
+  call.self = ThisObject(ctx, impl, bound.label);
   const ScriptValue value = GetValue(ctx, impl, 0);
   call.arguments = ScriptArguments(&value, 1);
   bool taken = false;
@@ -442,7 +457,7 @@ duk_ret_t ItemMethod(duk_context* ctx) {
   const BoundItem& bound = impl.items[static_cast<std::size_t>(duk_get_current_magic(ctx))];
   ScriptCall call;
   call.contextHandle = impl.owner->GetHandle();
-  if (!bound.item->IsStatic()) call.self = ThisObject(ctx, bound.label);
+  if (!bound.item->IsStatic()) call.self = ThisObject(ctx, impl, bound.label);
   const std::vector<ScriptValue> arguments = Arguments(ctx, impl);
   call.arguments = ScriptArguments(arguments);
   ScriptValue result;
@@ -490,7 +505,7 @@ duk_ret_t ClassConstructor(duk_context* ctx) {
 duk_ret_t BaseIsEqual(duk_context* ctx) {
   Impl& impl = GetImpl(ctx);
   static const std::string label = "isEqual";
-  ScriptObject* self = ThisObject(ctx, label);
+  ScriptObject* self = ThisObject(ctx, impl, label);
   const ScriptValue other = GetValue(ctx, impl, 0);
   bool equal = false;
   PendingError error;
@@ -522,6 +537,9 @@ duk_ret_t Finalize(duk_context* ctx) {
   const auto known = impl.wrappers.find(object);
   if (known != impl.wrappers.end() && known->second == duk_get_heapptr(ctx, 0)) {
     impl.wrappers.erase(known);
+    impl.natives.erase(duk_get_heapptr(ctx, 0));
+    if (duk_get_prop_literal(ctx, 0, kProxyKey)) impl.natives.erase(duk_get_heapptr(ctx, -1));
+    duk_pop(ctx);
     object->Release();
   }
   duk_push_pointer(ctx, nullptr);
@@ -805,6 +823,27 @@ void ReadError(duk_context* ctx, JavaScriptResult& result) {
   }
 }
 
+struct ResultReader {
+  Impl* impl;
+  JavaScriptResult* result;
+};
+
+// The completion value at index 0.
+duk_ret_t ReadValue(duk_context* ctx, void* udata) {
+  auto& reader = *static_cast<ResultReader*>(udata);
+  reader.result->value = GetValue(ctx, *reader.impl, 0);
+  duk_dup(ctx, 0);
+  duk_safe_to_string(ctx, -1);
+  reader.result->text = ToUTF8Text(ctx, -1);
+  return 0;
+}
+
+// The thrown value at index 0.
+duk_ret_t ReadErrorValue(duk_context* ctx, void* udata) {
+  ReadError(ctx, *static_cast<ResultReader*>(udata)->result);
+  return 0;
+}
+
 }  // namespace
 
 JavaScriptContext::Impl::~Impl() {
@@ -850,18 +889,22 @@ JavaScriptResult JavaScriptContext::Evaluate(std::string_view source, std::strin
   duk_push_lstring(ctx, fileName.data(), fileName.size());
   duk_int_t status = duk_pcompile(ctx, 0);
   if (status == DUK_EXEC_SUCCESS) status = duk_pcall(ctx, 0);
-  if (outer) impl_->timing = false;
+  // Reading the outcome may run script (getters, toString), so it runs
+  // protected and still under the time limit.
+  ResultReader reader{impl_.get(), &result};
   if (status == DUK_EXEC_SUCCESS) {
     result.ok = true;
-    result.value = GetValue(ctx, *impl_, -1);
-    duk_dup(ctx, -1);
-    duk_safe_to_string(ctx, -1);
-    result.text = ToUTF8Text(ctx, -1);
-    duk_pop(ctx);
-  } else {
-    ReadError(ctx, result);
+    if (duk_safe_call(ctx, ReadValue, &reader, 1, 1) != DUK_EXEC_SUCCESS) {
+      result = JavaScriptResult();
+      result.errorName = "RangeError";
+      result.text = "the script's value could not be read";
+    }
+  } else if (duk_safe_call(ctx, ReadErrorValue, &reader, 1, 1) != DUK_EXEC_SUCCESS) {
+    result.errorName = "Error";
+    result.text = "the error could not be read";
   }
   duk_pop(ctx);
+  if (outer) impl_->timing = false;
   return result;
 }
 

@@ -32,6 +32,23 @@ ContextRegistry& Contexts() {
 ScriptValue::ScriptValue(ScriptObjectPtr object)
     : kind_(object ? Kind::kObject : Kind::kNull), object_(std::move(object)) {}
 
+ScriptValue::ScriptValue(const ScriptValue& other)
+    : kind_(other.kind_),
+      bool_(other.bool_),
+      number_(other.number_),
+      object_(other.object_),
+      payload_(other.payload_ ? new Payload(*other.payload_) : nullptr) {}
+
+ScriptValue& ScriptValue::operator=(const ScriptValue& other) {
+  if (this != &other) *this = ScriptValue(other);
+  return *this;
+}
+
+const ScriptValue::Payload& ScriptValue::Empty() noexcept {
+  static const Payload empty;
+  return empty;
+}
+
 std::string ScriptValue::Describe() const {
   switch (kind_) {
     case Kind::kUndefined:
@@ -49,7 +66,7 @@ std::string ScriptValue::Describe() const {
     case Kind::kArray:
       return "array";
     case Kind::kOther:
-      return other_;
+      return Data().other;
   }
   return "value";
 }

@@ -31,8 +31,10 @@ class ZEBSCRIPTING_API ScriptObjectBase {
   virtual ~ScriptObjectBase();
 };
 
-class ZEBSCRIPTING_API ScriptObject : public ScriptObjectBase,
-                                      public zebcore::utility::RefCountedObjectWithWeakPtr {
+// The reference-counted base comes first, so that the object and its counted
+// part share one address.
+class ZEBSCRIPTING_API ScriptObject : public zebcore::utility::RefCountedObjectWithWeakPtr,
+                                      public ScriptObjectBase {
  public:
   // `name` is the registered class name; it must outlive the object (a
   // literal or the class's GetClassname()).

@@ -15,6 +15,7 @@
 
 #include <boost/intrusive_ptr.hpp>
 #include <cstddef>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -27,12 +28,18 @@ class ZEBSCRIPTING_API ScriptValue {
   ScriptValue() noexcept = default;  // undefined
   ScriptValue(bool value) noexcept : kind_(Kind::kBool), bool_(value) {}
   ScriptValue(double value) noexcept : kind_(Kind::kNumber), number_(value) {}
-  ScriptValue(std::u16string text) : kind_(Kind::kString), text_(std::move(text)) {}
+  ScriptValue(std::u16string text)
+      : kind_(Kind::kString), payload_(new Payload{std::move(text), {}, {}}) {}
   ScriptValue(const char16_t* text) : ScriptValue(std::u16string(text)) {}
   // A script object; a null pointer gives null.
   ScriptValue(ScriptObjectPtr object);
   ScriptValue(std::vector<ScriptValue> elements)
-      : kind_(Kind::kArray), elements_(std::move(elements)) {}
+      : kind_(Kind::kArray), payload_(new Payload{{}, std::move(elements), {}}) {}
+  ScriptValue(const ScriptValue& other);
+  ScriptValue& operator=(const ScriptValue& other);
+  ScriptValue(ScriptValue&&) noexcept = default;
+  ScriptValue& operator=(ScriptValue&&) noexcept = default;
+  ~ScriptValue() = default;
   // No implicit conversion from integers or narrow text: say which is meant.
   ScriptValue(int) = delete;
   ScriptValue(const char*) = delete;
@@ -46,7 +53,7 @@ class ZEBSCRIPTING_API ScriptValue {
   static ScriptValue Other(std::string what) {
     ScriptValue value;
     value.kind_ = Kind::kOther;
-    value.other_ = std::move(what);
+    value.payload_.reset(new Payload{{}, {}, std::move(what)});
     return value;
   }
 
@@ -64,22 +71,30 @@ class ZEBSCRIPTING_API ScriptValue {
   // The stored value; the defaults (false, 0.0, empty, null) for another kind.
   bool GetBool() const noexcept { return kind_ == Kind::kBool && bool_; }
   double GetNumber() const noexcept { return kind_ == Kind::kNumber ? number_ : 0.0; }
-  const std::u16string& GetString() const noexcept { return text_; }
+  const std::u16string& GetString() const noexcept { return Data().text; }
   const ScriptObjectPtr& GetObject() const noexcept { return object_; }
-  const std::vector<ScriptValue>& GetElements() const noexcept { return elements_; }
-  const std::string& GetOtherName() const noexcept { return other_; }
+  const std::vector<ScriptValue>& GetElements() const noexcept { return Data().elements; }
+  const std::string& GetOtherName() const noexcept { return Data().other; }
 
   // A short English name of the kind ("number", "TickTime object", "function").
   std::string Describe() const;
 
  private:
+  // Strings, arrays and "other" names live apart, so that the common kinds
+  // (numbers, booleans, objects) stay small and cheap to move.
+  struct Payload {
+    std::u16string text;
+    std::vector<ScriptValue> elements;
+    std::string other;
+  };
+  static const Payload& Empty() noexcept;
+  const Payload& Data() const noexcept { return payload_ ? *payload_ : Empty(); }
+
   Kind kind_ = Kind::kUndefined;
   bool bool_ = false;
   double number_ = 0.0;
-  std::u16string text_;
   ScriptObjectPtr object_;
-  std::vector<ScriptValue> elements_;
-  std::string other_;
+  std::unique_ptr<Payload> payload_;
 };
 
 // The arguments of one call, borrowed from the caller.
