@@ -15,3 +15,11 @@ if(TARGET zebmediatypes-script AND NOT ZMT_CONCURRENCY_TESTS_ONLY)
                    $<TARGET_FILE:zebmediatypes-script> ${PROJECT_SOURCE_DIR}/tools/examples)
   set_tests_properties(zebmediatypes_script_runner PROPERTIES LABELS unit)
 endif()
+
+# The audio, video and colour classes: script tables and edge cases, native
+# tables, definitions and lifetimes, and the held layout under threads.
+zmt_add_script_test(script_audio_objects scripting/audio_objects_test.js)
+zmt_add_script_test(script_video_objects scripting/video_objects_test.js)
+zmt_add_test(zebmediatypes_script_objects_test SOURCES scripting/media_objects_test.cpp)
+zmt_add_test(zebmediatypes_script_objects_concurrency_test
+             SOURCES scripting/audio_objects_concurrency_test.cpp CONCURRENT)

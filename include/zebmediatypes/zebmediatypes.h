@@ -41,4 +41,8 @@
 #include <zebmediatypes/color/rgba.h>
 #include <zebmediatypes/initialization.h>
 #include <zebmediatypes/mime_types.h>
+#include <zebmediatypes/scripting/audio_constants.h>
+#include <zebmediatypes/scripting/audio_objects.h>
+#include <zebmediatypes/scripting/pixel_format_constants.h>
 #include <zebmediatypes/scripting/time_objects.h>
+#include <zebmediatypes/scripting/video_objects.h>

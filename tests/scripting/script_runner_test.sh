@@ -46,7 +46,7 @@ expect "bad option" 2 "" "*" -- "$runner" --bogus
 expect "bad timeout" 2 "" "*" -- "$runner" --timeout x -e '1'
 expect "-e without code" 2 "" "*" -- "$runner" -e
 expect "lines" 0 "$(printf '2\n0\nafter')" "<stdin>:1: ReferenceError: identifier 'nosuch' undefined" -- "$runner" < "$work/lines"
-expect "example" 0 "$(printf '60.06 s is 15256200960000 ticks, timecode 00;01;00;02\n00;10;00;00 is 599.9994 s\na 59.94 field lasts 1001/60000 s\nrefused: RangeError TickTime.ticksNumber: the value was refused')" "" -- "$runner" "$examples/time.js"
+expect "example" 0 "$(printf '60.06 s is 15256200960000 ticks, timecode 00;01;00;02\n00;10;00;00 is 599.9994 s\na 59.94 field lasts 1001/60000 s\naudio: 48000 Hz, 24 bit, 5.1 (L, R, C, LFE, Ls, Rs)\nvideo: pixel format uyvy true\nrefused: RangeError TickTime.ticksNumber: the value was refused')" "" -- "$runner" "$examples/time.js"
 
 if [ "$failures" -ne 0 ]; then
   echo "$failures failures"

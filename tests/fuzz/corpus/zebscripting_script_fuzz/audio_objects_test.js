@@ -1,0 +1,1 @@
+../../../scripting/audio_objects_test.js

@@ -1,0 +1,1 @@
+../../../scripting/video_objects_test.js
