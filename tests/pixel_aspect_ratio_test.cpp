@@ -64,6 +64,8 @@ TEST(ReducePixelAspectRatio, GivesLowestTermsOrThrowsSayingWhy) {
   const Case kCases[] = {
       {{768, 702}, "128:117"},
       {{0, 2}, "0:1"},
+      // the largest term accepted
+      {{INT_MAX, 1}, "2147483647:1"},
       {{5, 0}, "zero denominator"},
       {{2147483648u, 1}, "out of range"},
       {{1, 2147483648u}, "out of range"},
