@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 #include <zebmediatypes/video_descriptions.h>
 
+#include <cstdint>
 #include <set>
 #include <sstream>
 #include <string>
@@ -47,22 +48,19 @@ TEST(PixelFormatDescription, EveryCatalogueRowHasATidyDescription) {
   }
 }
 
+std::string DescriptiveName(std::uint32_t name) {
+  return zebcore::string::ToStdString(GetFourCCDescriptiveName(static_cast<PixelFormatName>(name)));
+}
+
 TEST(GetFourCCDescriptiveName, EveryCatalogueRowButThreeHasItsOwnName) {
   std::set<std::string> names;
   for (const PixelFormat* pf = AllPixelFormatsBegin(); pf != AllPixelFormatsEnd(); ++pf) {
-    names.insert(zebcore::string::ToStdString(GetFourCCDescriptiveName(pf->fourCC)));
+    names.insert(DescriptiveName(pf->fourCC));
   }
-  // v21f, y210 and y21f share "Invalid"
-  EXPECT_EQ(names.size(), 112u - 2);
-  const std::pair<const char*, const char*> kCases[] = {
-      // its word is the HDR row's
-      {"Phl0", "P010_MPEG4_FIELD_HDR_HLG"},
-  };
-  for (const auto& [name, text] : kCases) {
-    EXPECT_EQ(zebcore::string::ToStdString(GetFourCCDescriptiveName(
-                  MakePixelFormatName(name[0], name[1], name[2], name[3]))),
-              text);
-  }
+  // v21f, y210 and y21f have no name of their own: they share "Invalid".
+  EXPECT_TRUE(names.size() == 110 && names.count("Invalid") == 1);
+  // A row found by its name, though its word is an HDR row's.
+  EXPECT_EQ(DescriptiveName(MakePixelFormatName("Phl0")), "P010_MPEG4_FIELD_HDR_HLG");
 }
 
 TEST(VideoDescriptions, NameKnownValuesAndLeaveOthersEmpty) {
