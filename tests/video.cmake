@@ -6,7 +6,7 @@ zmt_add_test(video_tests SOURCES
   video_descriptions_test.cpp
 )
 if(TARGET video_tests)
-  # The plane layouts are checked against libavutil's image layouts.
+  # Plane layouts and frame sizes are checked against libavutil's images.
   find_package(PkgConfig REQUIRED)
   pkg_check_modules(AVUTIL REQUIRED IMPORTED_TARGET libavutil)
   target_link_libraries(video_tests PRIVATE PkgConfig::AVUTIL)
