@@ -11,8 +11,8 @@ namespace {
 using testing::ParseLayout;
 using Rows = std::vector<std::vector<double>>;
 
-Rows ComputeRows(const AudioChannelLayout& source, const AudioChannelLayout& destination,
-                 ChannelConversionMatrix matrix = {}) {
+Rows ComputeRows(const AudioChannelLayout& source, const AudioChannelLayout& destination) {
+  ChannelConversionMatrix matrix;
   ComputeChannelConversionMatrix(source, destination, matrix);
   Rows rows;
   for (const ChannelConversionMatrixRow& row : matrix) rows.emplace_back(row.begin(), row.end());
