@@ -1,56 +1,16 @@
 #include <gtest/gtest.h>
 #include <zebcore/assert.h>
+#include <zebmediatypes/audio_bus.h>
 #include <zebmediatypes/audio_format.h>
+#include <zebmediatypes/audio_frame_rate_utils.h>
 
 #include <cstdint>
 #include <limits>
-#include <vector>
 
 namespace zebmediatypes {
 namespace {
 
 using L = AudioChannelLabel;
-constexpr AudioSampleType kInt16 = kAudioSampleType_16BitInteger;
-constexpr AudioSampleType kFloat = kAudioSampleType_32BitFloat;
-const AudioChannelLayout kLR = {L::FrontLeft, L::FrontRight};
-const AudioChannelLayout kRL = {L::FrontRight, L::FrontLeft};
-
-AudioFormat Format(int rate, AudioSampleType type, const AudioChannelLayout& layout) {
-  AudioFormat format = AudioFormat::CreateAudioFormat(layout, rate);
-  format.SetSampleType(type);
-  return format;
-}
-
-TEST(AudioFormat, CreateDefaultAudioFormatChoosesTheLayoutByCount) {
-  for (std::size_t count : {0u, 1u, 2u, 3u, 4u, 6u, 8u}) {
-    SCOPED_TRACE(count);
-    const AudioFormat format = AudioFormat::CreateDefaultAudioFormat(count, 48000);
-    const AudioChannelLayout expected = count == 2   ? kLR
-                                        : count == 6 ? CreateBroadcast51ChannelLayout()
-                                                     : AudioChannelLayout(count, L::Discrete);
-    EXPECT_EQ(format, Format(48000, kFloat, expected));
-    EXPECT_EQ(format.GetSampleAlignment(), static_cast<int>(4 * count));
-  }
-}
-
-TEST(AudioFormat, HugeChannelCountIsReportedAndClamped) {
-  const std::size_t kCases[] = {kAudioChannelCount_Max, kAudioChannelCount_Max + 1,
-                                (std::size_t{1} << 32) + 3,
-                                std::numeric_limits<std::size_t>::max()};
-  for (std::size_t count : kCases) {
-    SCOPED_TRACE(count);
-    zebcore::debug::ScopedAssertionCapture capture;
-    EXPECT_EQ(AudioFormat::CreateDefaultAudioFormat(count, 44100).GetChannelCount(),
-              kAudioChannelCount_Max);
-    EXPECT_EQ(capture.Count(), count > kAudioChannelCount_Max ? 1u : 0u);
-  }
-  // A layout set directly is clamped where the alignment narrows its count.
-  zebcore::debug::ScopedAssertionCapture capture;
-  const AudioFormat oversized = AudioFormat::CreateAudioFormat(
-      AudioChannelLayout(kAudioChannelCount_Max + 5, L::Discrete), 48000);
-  EXPECT_EQ(oversized.GetSampleAlignment(), static_cast<int>(4 * kAudioChannelCount_Max));
-  EXPECT_EQ(capture.Count(), 1u);
-}
 
 TEST(AudioFormat, SampleAlignmentIsBytesPerSampleTimesChannels) {
   struct Case {
@@ -58,75 +18,93 @@ TEST(AudioFormat, SampleAlignmentIsBytesPerSampleTimesChannels) {
     std::size_t channels;
     int alignment;
   };
-  constexpr Case kCases[] = {{10, 2, 2}, {20, 2, 4}, {30, 2, 6}, {40, 2, 8}, {40, 6, 24},
-                             {0, 6, 0},  {8, 2, 0},  {25, 2, 0}, {32, 2, 0}, {30, 0, 0}};
+  const Case kCases[] = {
+      {20, 2, 4},   // 16-bit
+      {30, 2, 6},   // packed 24-bit
+      {40, 6, 24},  // float
+      {25, 2, 0},   // no such type
+      {30, 0, 0},   // no channels
+  };
   for (const Case& c : kCases) {
-    SCOPED_TRACE(testing::Message() << c.type << " x " << c.channels);
+    SCOPED_TRACE(c.type);
     AudioFormat format = AudioFormat::CreateDefaultAudioFormat(c.channels, 48000);
     format.SetSampleType(static_cast<AudioSampleType>(c.type));
     EXPECT_EQ(format.GetSampleAlignment(), c.alignment);
   }
 }
 
-TEST(AudioFormat, ChannelLookupsGiveNeutralResultsOutOfRange) {
-  const AudioFormat format = Format(48000, kInt16, {L::FrontLeft, L::FrontRight, L::FrontLeft});
-  EXPECT_EQ(format.GetChannelDescription(1), AudioChannelDescription(L::FrontRight));
-  EXPECT_EQ(format.GetChannelDescription(3), AudioChannelDescription(L::Discrete));
-  EXPECT_EQ(format.GetChannelDescription(std::numeric_limits<std::size_t>::max()),
-            AudioChannelDescription(L::Discrete));
-  EXPECT_EQ(format.GetChannelIndex(L::FrontLeft), 0u);  // first of two
-  EXPECT_EQ(format.GetChannelIndex(L::FrontCenter), format.GetChannelCount());
+TEST(AudioFormat, HugeChannelCountIsReportedAndClamped) {
+  zebcore::debug::ScopedAssertionCapture capture;
+  EXPECT_EQ(AudioFormat::CreateDefaultAudioFormat(SIZE_MAX, 44100).GetChannelCount(),
+            kAudioChannelCount_Max);
+  // A layout set directly is clamped where the alignment narrows its count.
+  const AudioFormat oversized = AudioFormat::CreateAudioFormat(
+      AudioChannelLayout(kAudioChannelCount_Max + 5, L::Discrete), 48000);
+  EXPECT_EQ(oversized.GetSampleAlignment(), static_cast<int>(4 * kAudioChannelCount_Max));
+  EXPECT_EQ(capture.Count(), 2u);
 }
 
-TEST(AudioFormatExactCompare, IsAStrictWeakOrderWhoseEquivalenceIsEquality) {
-  // clang-format off
-  const AudioChannelLayout layouts[] = {{}, {L::FrontLeft}, kLR, kRL, {L::Discrete, L::Discrete},
-                                        CreateBroadcast51ChannelLayout(), CreateLegacy51ChannelLayout()};
-  // clang-format on
-  std::vector<AudioFormat> formats;
-  for (int rate : {-1, 0, 44100, 48000})
-    for (AudioSampleType type : {kInt16, kFloat})
-      for (const AudioChannelLayout& layout : layouts)
-        formats.push_back(Format(rate, type, layout));
-  const AudioFormatExactCompare less;
-  for (const AudioFormat& a : formats) {
-    for (const AudioFormat& b : formats) {
-      EXPECT_FALSE(less(a, b) && less(b, a));
-      EXPECT_EQ(!less(a, b) && !less(b, a), &a == &b);  // every sample differs from the others
-      EXPECT_EQ(a == b, &a == &b);
-      for (const AudioFormat& c : formats) EXPECT_TRUE(!(less(a, b) && less(b, c)) || less(a, c));
-    }
-  }
-}
-
-TEST(AudioFormatCompare, ExactOrdersByRateLayoutTypeAndSimpleIgnoresLabels) {
-  const AudioChannelLayout k51 = CreateBroadcast51ChannelLayout();
-  struct Case {
-    AudioFormat a, b;
-    bool exactLess, simpleLess, simpleGreater;
-  };
-  // clang-format off
-  const Case kCases[] = {
-      {Format(44100, kFloat, kRL), Format(48000, kInt16, kLR), true, true, false},
-      {Format(-1, kFloat, kLR), Format(0, kFloat, kLR), true, true, false},
-      {Format(48000, kFloat, kLR), Format(48000, kInt16, kRL), true, false, true},
-      {Format(48000, kFloat, {L::FrontLeft}), Format(48000, kInt16, kLR), true, true, false},
-      {Format(48000, kFloat, {}), Format(48000, kInt16, {L::Discrete}), true, true, false},
-      {Format(48000, kInt16, kLR), Format(48000, kFloat, kLR), true, true, false},
-      {Format(48000, kFloat, kLR), Format(48000, kFloat, kRL), true, false, false},
-      {Format(48000, kFloat, kLR), Format(48000, kFloat, {L::Discrete, L::Discrete}), false, false, false},
-      {Format(48000, kFloat, kLR), Format(48000, kInt16, k51), true, true, false},
-      {Format(44100, kFloat, k51), Format(48000, kFloat, kLR), true, true, false},
-  };
-  // clang-format on
+// Exact orders by rate first and tells the 5.1 orders apart; simple is blind
+// to labels.
+TEST(AudioFormatCompare, ExactOrdersByRateAndSimpleIgnoresLabels) {
+  const AudioFormat broadcast = AudioFormat::CreateDefaultAudioFormat(6, 48000);
+  const AudioFormat legacy = AudioFormat::CreateAudioFormat(CreateLegacy51ChannelLayout(), 48000);
+  const AudioFormat slower = AudioFormat::CreateDefaultAudioFormat(8, 44100);
   const AudioFormatExactCompare exact;
   const AudioFormatSimpleCompare simple;
-  for (std::size_t i = 0; i < std::size(kCases); ++i) {
-    SCOPED_TRACE(i);
-    const Case& c = kCases[i];
-    EXPECT_EQ(exact(c.a, c.b), c.exactLess);
-    EXPECT_EQ(simple(c.a, c.b), c.simpleLess);
-    EXPECT_EQ(simple(c.b, c.a), c.simpleGreater);
+  EXPECT_NE(exact(broadcast, legacy), exact(legacy, broadcast));
+  EXPECT_FALSE(simple(broadcast, legacy) || simple(legacy, broadcast));
+  EXPECT_TRUE(exact(slower, legacy) && simple(slower, legacy) && !exact(legacy, slower));
+}
+
+// Equivalent buses carry the same layouts (in order, when order counts).
+TEST(AudioBusDescription, EquivalenceLooksAtLayoutsOnly) {
+  const auto stereo = AudioBusDescription::CreateStereo(u"s", AudioBusDescription::Main);
+  const AudioBusDescription discrete(u"d", CreateMultichannelLayout(2), AudioBusDescription::Main);
+  EXPECT_FALSE(AreAudioBusDescriptionsEquivalent({stereo}, {discrete}, true));
+  EXPECT_TRUE(AreAudioBusDescriptionsEquivalent({stereo}, {discrete}, false));
+}
+
+constexpr std::int64_t kTicksPerSecond = 254016000000;
+
+TEST(FindBestNativeAudioRate, PrefersWholeMultiplesThenTheNextRateAbove) {
+  struct Case {
+    std::int64_t hertz;
+    std::int64_t nativeHertz;
+  };
+  const Case kCases[] = {
+      {100000, 96000},  // above all
+      {176400, 88200},  // twice 88200
+      {22000, 22050},   // the next above
+      {3000, 48000},    // sixteen times, the most taken
+      {7350, 22050},    // three times
+      {500, 8000},      // below all
+  };
+  zebcore::debug::ScopedAssertionCapture capture;
+  for (const Case& c : kCases) {
+    EXPECT_EQ(FindBestNativeAudioRate(FrameRate(kTicksPerSecond / c.hertz)),
+              FrameRate(kTicksPerSecond / c.nativeHertz))
+        << c.hertz;
+  }
+  EXPECT_EQ(capture.Count(), 0u);
+}
+
+TEST(FindBestNativeAudioRate, RatesOfNoValueAreReportedAndGiveFixedRates) {
+  zebcore::debug::ScopedAssertionCapture capture;
+  EXPECT_EQ(FindBestNativeAudioRate(FrameRate(0)), kFrameRate_Audio96000);
+  EXPECT_EQ(FindBestNativeAudioRate(kFrameRate_Invalid), kFrameRate_Audio8000);
+  EXPECT_EQ(capture.Count(), 2u);
+}
+
+// The result is native and, up to 96000 Hz, never slower than the request, so
+// the host only ever upsamples.
+TEST(FindBestNativeAudioRate, NeverDownsamplesAudibleRatesExhaustive) {
+  const NativeFrameRateSet native = GetNativeFrameRates();
+  ASSERT_EQ(native.size(), 9u);
+  for (std::int64_t ticks = 1; ticks <= 40000000; ++ticks) {
+    const FrameRate best = FindBestNativeAudioRate(FrameRate(ticks));
+    ASSERT_EQ(native.count(best), 1u) << ticks;
+    ASSERT_TRUE(ticks < 2646000 || ticks > 31752000 || best.GetTicksPerFrame() <= ticks) << ticks;
   }
 }
 
