@@ -7,11 +7,11 @@
 
 #include <cmath>
 #include <cstdio>
-#include <map>
 #include <string>
 #include <vector>
 
 #include "alloc_counter.h"
+#include "run_times.h"
 
 extern "C" {
 #include <libavutil/channel_layout.h>
@@ -102,26 +102,6 @@ void Peer(benchmark::State& state, const Conversion& conversion) {
   av_channel_layout_uninit(&destination);
 }
 
-// Keeps each run's CPU time per iteration, in nanoseconds, by name (CPU time,
-// as the machine may be shared).
-class CollectingReporter : public benchmark::ConsoleReporter {
- public:
-  void ReportRuns(const std::vector<Run>& runs) override {
-    ConsoleReporter::ReportRuns(runs);
-    for (const Run& run : runs) {
-      if (run.run_type != Run::RT_Iteration) continue;
-      times_[run.benchmark_name()] = run.GetAdjustedCPUTime();
-    }
-  }
-  double TimeOf(const std::string& name) const {
-    const auto found = times_.find(name);
-    return found == times_.end() ? NAN : found->second;
-  }
-
- private:
-  std::map<std::string, double> times_;
-};
-
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -134,20 +114,18 @@ int main(int argc, char** argv) {
                                  conversion);
     benchmark::RegisterBenchmark(("ConversionMatrix/peer/" + name).c_str(), Peer, conversion);
   }
-  benchmark::Initialize(&argc, argv);
-  if (benchmark::ReportUnrecognizedArguments(argc, argv)) return 1;
-  CollectingReporter reporter;
-  benchmark::RunSpecifiedBenchmarks(&reporter);
-  benchmark::Shutdown();
+  const auto times = zmt::bench::RunAndCollectTimes(argc, argv);
+  if (!times) return 1;
 
   std::printf(
       "\nComputeChannelConversionMatrix (ours, ours-new-matrix) and ComputeDownmixMatrix "
       "(ours-downmix) against swr_build_matrix2 (same run):\n");
   for (const Conversion& conversion : kConversions) {
     const std::string name = conversion.name;
-    const double peer = reporter.TimeOf("ConversionMatrix/peer/" + name);
+    const double peer = zmt::bench::TimeOf(*times, "ConversionMatrix/peer/" + name);
     for (const char* variant : {"ours", "ours-new-matrix", "ours-downmix"}) {
-      const double ours = reporter.TimeOf(std::string("ConversionMatrix/") + variant + "/" + name);
+      const double ours =
+          zmt::bench::TimeOf(*times, std::string("ConversionMatrix/") + variant + "/" + name);
       if (std::isnan(ours) || std::isnan(peer)) continue;
       std::printf("  %-12s %-16s ours %8.1f ns, peer %8.1f ns, ratio %6.1fx\n", name.c_str(),
                   variant, ours, peer, peer / ours);

@@ -10,10 +10,12 @@
 #include <zebmediatypes/timecode.h>
 #include <zebscripting/javascript.h>
 
+#include <cmath>
 #include <cstdio>
-#include <map>
 #include <string>
 #include <vector>
+
+#include "run_times.h"
 
 namespace {
 
@@ -59,36 +61,11 @@ BENCHMARK(ScriptPlainFunction)->Unit(benchmark::kMillisecond);
 BENCHMARK(ScriptTimeToTimecode)->Unit(benchmark::kMillisecond);
 BENCHMARK(NativeTimeToTimecode)->Unit(benchmark::kMillisecond);
 
-// Keeps each benchmark's CPU time per iteration (ns) while the console
-// reporter prints.
-class CollectingReporter : public benchmark::ConsoleReporter {
- public:
-  void ReportRuns(const std::vector<Run>& runs) override {
-    for (const Run& run : runs) {
-      if (run.run_type == Run::RT_Iteration && run.repetitions <= 1) {
-        times_[run.benchmark_name()] = run.GetAdjustedCPUTime() * 1e6;  // ms -> ns
-      } else if (run.run_type == Run::RT_Aggregate && run.aggregate_name == "median") {
-        times_[run.run_name.str()] = run.GetAdjustedCPUTime() * 1e6;
-      }
-    }
-    ConsoleReporter::ReportRuns(runs);
-  }
-  const std::map<std::string, double>& times() const { return times_; }
-
- private:
-  std::map<std::string, double> times_;
-};
-
 }  // namespace
 
 int main(int argc, char** argv) {
-  benchmark::Initialize(&argc, argv);
-  if (benchmark::ReportUnrecognizedArguments(argc, argv)) return 1;
-  CollectingReporter reporter;
-  benchmark::RunSpecifiedBenchmarks(&reporter);
-  benchmark::Shutdown();
-
-  const auto& t = reporter.times();
+  const auto times = zmt::bench::RunAndCollectTimes(argc, argv);
+  if (!times) return 1;
   const struct {
     const char* label;
     const char* ours;
@@ -100,12 +77,11 @@ int main(int argc, char** argv) {
   };
   std::printf("\n");
   for (const auto& pair : kPairs) {
-    const auto ours = t.find(pair.ours);
-    const auto floor = t.find(pair.floor);
-    if (ours == t.end() || floor == t.end() || floor->second <= 0) continue;
+    const double ours = zmt::bench::TimeOf(*times, pair.ours);
+    const double floor = zmt::bench::TimeOf(*times, pair.floor);
+    if (std::isnan(ours) || std::isnan(floor) || floor <= 0) continue;
     std::printf("%-18s script %7.1f ns/call, %s %7.1f ns/call, ratio %.2f\n", pair.label,
-                ours->second / kCalls, pair.floorName, floor->second / kCalls,
-                ours->second / floor->second);
+                ours / kCalls, pair.floorName, floor / kCalls, ours / floor);
   }
   return 0;
 }

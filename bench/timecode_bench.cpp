@@ -13,13 +13,14 @@ extern "C" {
 
 #include <benchmark/benchmark.h>
 
+#include <cmath>
 #include <cstdint>
 #include <cstdio>
-#include <map>
 #include <string>
 #include <vector>
 
 #include "alloc_counter.h"
+#include "run_times.h"
 
 namespace media = zebmediatypes;
 
@@ -127,37 +128,11 @@ BENCHMARK_CAPTURE(PeerRead, 25, kPeer25, AV_TIMECODE_FLAG_24HOURSMAX);
 BENCHMARK_CAPTURE(OursFormat, 35mmFeetFrames, k35mm);
 BENCHMARK_CAPTURE(OursRead, 35mmFeetFrames, k35mm);
 
-// Keeps each benchmark's CPU time per iteration (ns) while the console
-// reporter prints.
-class CollectingReporter : public benchmark::ConsoleReporter {
- public:
-  void ReportRuns(const std::vector<Run>& runs) override {
-    for (const Run& run : runs) {
-      // One run, or the median of repetitions when there are several.
-      if (run.run_type == Run::RT_Iteration && run.repetitions <= 1) {
-        times_[run.benchmark_name()] = run.GetAdjustedCPUTime();
-      } else if (run.run_type == Run::RT_Aggregate && run.aggregate_name == "median") {
-        times_[run.run_name.str()] = run.GetAdjustedCPUTime();
-      }
-    }
-    ConsoleReporter::ReportRuns(runs);
-  }
-  const std::map<std::string, double>& times() const { return times_; }
-
- private:
-  std::map<std::string, double> times_;
-};
-
 }  // namespace
 
 int main(int argc, char** argv) {
-  benchmark::Initialize(&argc, argv);
-  if (benchmark::ReportUnrecognizedArguments(argc, argv)) return 1;
-  CollectingReporter reporter;
-  benchmark::RunSpecifiedBenchmarks(&reporter);
-  benchmark::Shutdown();
-
-  const auto& t = reporter.times();
+  const auto times = zmt::bench::RunAndCollectTimes(argc, argv);
+  if (!times) return 1;
   const struct {
     const char* label;
     const char* ours;
@@ -170,15 +145,15 @@ int main(int argc, char** argv) {
   };
   std::printf("\n");
   for (const auto& pair : kPairs) {
-    const auto ours = t.find(pair.ours);
-    const auto peer = t.find(pair.peer);
-    if (ours == t.end() || peer == t.end() || ours->second <= 0) continue;
-    std::printf("%-24s ours %6.1f ns, libavutil %6.1f ns, ratio %.2f\n", pair.label, ours->second,
-                peer->second, peer->second / ours->second);
+    const double ours = zmt::bench::TimeOf(*times, pair.ours);
+    const double peer = zmt::bench::TimeOf(*times, pair.peer);
+    if (std::isnan(ours) || std::isnan(peer) || ours <= 0) continue;
+    std::printf("%-24s ours %6.1f ns, libavutil %6.1f ns, ratio %.2f\n", pair.label, ours, peer,
+                peer / ours);
   }
   for (const char* name : {"OursFormat/35mmFeetFrames", "OursRead/35mmFeetFrames"}) {
-    const auto ours = t.find(name);
-    if (ours != t.end()) std::printf("%-24s ours %6.1f ns (no peer)\n", name, ours->second);
+    const double ours = zmt::bench::TimeOf(*times, name);
+    if (!std::isnan(ours)) std::printf("%-24s ours %6.1f ns (no peer)\n", name, ours);
   }
   return 0;
 }
