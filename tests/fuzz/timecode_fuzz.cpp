@@ -15,60 +15,51 @@
 #include <cstring>
 #include <iterator>
 #include <optional>
+#include <vector>
 
 namespace media = zebmediatypes;
 
 namespace {
 
-const media::TimeDisplay kDisplays[] = {
-    media::TimeDisplay(media::kTimeDisplay_24Timecode),
-    media::TimeDisplay(media::kTimeDisplay_25Timecode),
-    media::TimeDisplay(media::kTimeDisplay_2997DropTimecode),
-    media::TimeDisplay(media::kTimeDisplay_2997NonDropTimecode),
-    media::TimeDisplay(media::kTimeDisplay_30Timecode),
-    media::TimeDisplay(media::kTimeDisplay_50Timecode),
-    media::TimeDisplay(media::kTimeDisplay_5994DropTimecode),
-    media::TimeDisplay(media::kTimeDisplay_5994NonDropTimecode),
-    media::TimeDisplay(media::kTimeDisplay_60Timecode),
-    media::TimeDisplay(media::kTimeDisplay_Frames),
-    media::TimeDisplay(media::kTimeDisplay_23976Timecode),
-    media::TimeDisplay(media::kTimeDisplay_16mmFeetFrames),
-    media::TimeDisplay(media::kTimeDisplay_35mmFeetFrames),
-    media::TimeDisplay(media::kTimeDisplay_48Timecode),
-    media::TimeDisplay(media::kTimeDisplay_11988Timecode),
-    media::TimeDisplay(media::kTimeDisplay_14985Timecode),
-    media::TimeDisplay(media::kTimeDisplay_AudioSamplesTimecode),
-    media::TimeDisplay(media::kTimeDisplay_AudioMsTimecode),
-    media::TimeDisplay::CreateCustom(1),
-    media::TimeDisplay::CreateCustom(10),
-    media::TimeDisplay::CreateCustom(101),
-    media::TimeDisplay::CreateCustom(1000000),
-    media::TimeDisplay::CreateCustom(4294967295u),
-    media::TimeDisplay(),
-    media::TimeDisplay(150u),
-};
+// Byte 0 picks the display: 0 to 17 a standard one by code (24 fps timecode
+// to 14.985, then audio samples and milliseconds), 18 the default, 19 a code
+// that names none, 20 to 127 custom counts 1 to 108, and above that counts of
+// up to 2^32 - 1.
+media::TimeDisplay PickDisplay(unsigned b) {
+  if (b < 16) return media::TimeDisplay(media::TimeDisplayType(media::kTimeDisplay_24Timecode + b));
+  if (b < 18)
+    return media::TimeDisplay(
+        media::TimeDisplayType(media::kTimeDisplay_AudioSamplesTimecode + b - 16));
+  if (b == 18) return media::TimeDisplay();
+  if (b == 19) return media::TimeDisplay(150u);
+  return media::TimeDisplay::CreateCustom(b < 128 ? b - 19 : 4294967295u / (256 - b));
+}
 
-const media::FrameRate kRates[] = {
-    media::kFrameRate_Video11_988,   media::kFrameRate_Video14_985,
-    media::kFrameRate_Video23_976,   media::kFrameRate_Video24,
-    media::kFrameRate_Video25,       media::kFrameRate_Video29_97,
-    media::kFrameRate_Video30,       media::kFrameRate_Video48,
-    media::kFrameRate_Video50,       media::kFrameRate_Video59_94,
-    media::kFrameRate_Video60,       media::kFrameRate_Video100,
-    media::kFrameRate_Video119_88,   media::kFrameRate_Milliseconds,
-    media::kFrameRate_Audio8000,     media::kFrameRate_Audio44100,
-    media::kFrameRate_Audio48000,    media::kFrameRate_Audio192000,
-    media::kFrameRate_Invalid,       media::FrameRate(0),
-    media::FrameRate(-10584000000),  media::FrameRate(1),
-    media::FrameRate(INT64_MAX - 1),
-};
+// The video rates, milliseconds, the audio rate constants, no rate, a zero and
+// a negative rate, and the extremes.
+std::vector<media::FrameRate> MakeRates() {
+  std::vector<media::FrameRate> rates;
+  for (double fps : {11.988, 14.985, 23.976, 24.0, 25.0, 29.97, 30.0, 48.0, 50.0, 59.94, 60.0,
+                     100.0, 119.88, 1000.0}) {
+    rates.push_back(media::MatchedFrameRateFromFloat(fps));
+  }
+  rates.insert(rates.end(), std::begin(media::details::kAudioRateConstants),
+               std::end(media::details::kAudioRateConstants));
+  for (std::int64_t ticks :
+       {INT64_MAX, std::int64_t{0}, std::int64_t{-10584000000}, std::int64_t{1}, INT64_MAX - 1}) {
+    rates.emplace_back(ticks);
+  }
+  return rates;
+}
+
+const std::vector<media::FrameRate> kRates = MakeRates();
 
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   if (size < 3) return 0;
-  const media::TimeDisplay display = kDisplays[data[0] % std::size(kDisplays)];
-  const media::FrameRate rate = kRates[data[1] % std::size(kRates)];
+  const media::TimeDisplay display = PickDisplay(data[0]);
+  const media::FrameRate rate = kRates[data[1] % kRates.size()];
   const unsigned flags = data[2] & 0x3F;
   const bool utf16 = (data[2] & 0x80) != 0;
   data += 3;
