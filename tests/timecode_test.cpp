@@ -257,5 +257,20 @@ TEST(Timecode, FormatAndReadAreInversesAroundZeroBoundariesAndAcrossTheDay) {
   }
 }
 
+// Every frame of a day, in the optimized build; samples and milliseconds are
+// more than a sweep can visit, so those take a prime stride after the first hour.
+TEST(Timecode, EveryFrameOfTheDayRoundTripsExhaustive) {
+  for (const RoundTripCase& c : kRoundTrips) {
+    SCOPED_TRACE(c.name);
+    const std::int64_t perSecond = UnitsPerSecond(c);
+    const std::int64_t stride = perSecond >= 1000 ? 401 : 1;
+    Sweep(c, -3600 * perSecond, 3600 * perSecond, 1);
+    Sweep(c, 3600 * perSecond, EndUnit(c), stride);
+    if (c.framesPerUnit == 1) {
+      Sweep(c, -3600 * perSecond, EndUnit(c), stride, kTimecodeFlag_InclusiveEnd);
+    }
+  }
+}
+
 }  // namespace
 }  // namespace zebmediatypes
