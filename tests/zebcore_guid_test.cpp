@@ -20,14 +20,15 @@ Guid HashOf(const void* data, std::size_t size) {
 }
 
 TEST(Murmur3, MatchesPublishedDigests) {
-  // clang-format off
-  struct Case { const char* text; const char* digest; };  // the bytes of h1 then h2, little-endian
+  struct Case {
+    const char* text;
+    const char* digest;
+  };  // the bytes of h1 then h2, little-endian
   const Case kCases[] = {
       {"", "00000000-0000-0000-0000-000000000000"},
       {"foo", "6145f501-5786-71e2-877d-ba2be487af7e"},
       {"The quick brown fox jumps over the lazy dog", "6c1b07bc-7bbc-4be3-4793-9ac4a93c437a"},
   };
-  // clang-format on
   for (const Case& c : kCases) {
     SCOPED_TRACE(c.text);
     EXPECT_EQ(HashOf(c.text, std::strlen(c.text)).ToString(), c.digest);

@@ -45,16 +45,12 @@ TEST(MimeTypes, CatalogueHoldsEachFamilyInOrderOnceEach) {
   EXPECT_EQ(withParameters, 4);
 }
 
-TEST(MimeTypes, TextsAreKeptExactly) {
-  // clang-format off
-  const std::pair<zebcore::utility::ImmutableString, const char*> kCases[] = {
-      {kMimeType_Application_7Zip, "application/x-7z-compressed"}, {kMimeType_Audio_MP3_, "audio/x-mp3"},
-      {kMimeType_Application_OctetStream, "application/octet-stream"}, {kMimeType_Audio_MP3________, "audio/x-mpeg3"},
-      {kMimeType_Audio_RealAudio_, "audio/application/x-pn-realaudio"}, {kMimeType_Audio_VndDolbyPL2, "audio/vnd.dolby.pl2"},
-      {kMimeType_Audio_TrueAudio1, "audio/tta; version=\"1\""}, {kMimeType_Audio_TrueAudio2, "audio/tta; version=\"2\""},
-      {kMimeType_Audio_VndRNRealaudio3, "audio/vnd.rn-realaudio; version=\"3\""}};
-  // clang-format on
-  for (const auto& [constant, text] : kCases) EXPECT_EQ(constant.View(), text);
+// The catalogue itself is checked by its properties above; these texts are the
+// ones that look like slips but are kept as registered.
+TEST(MimeTypes, UnusualTextsAreKeptExactly) {
+  EXPECT_EQ(kMimeType_Audio_RealAudio_.View(), "audio/application/x-pn-realaudio");
+  EXPECT_EQ(kMimeType_Audio_TrueAudio1.View(), "audio/tta; version=\"1\"");
+  EXPECT_EQ(kMimeType_Audio_MP3________.View(), "audio/x-mpeg3");
 }
 
 }  // namespace
