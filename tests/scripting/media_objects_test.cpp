@@ -2,6 +2,7 @@
 // against the tables they come from, the definitions, hashing, and the held
 // layout's lifetime.
 #include <gtest/gtest.h>
+#include <zebmediatypes/audio_descriptions.h>
 #include <zebmediatypes/scripting/audio_constants.h>
 #include <zebmediatypes/scripting/audio_objects.h>
 #include <zebmediatypes/scripting/pixel_format_constants.h>
@@ -47,13 +48,25 @@ std::string Description(const char* className, const std::string& item) {
   return found != nullptr ? found->GetDescription() : "(no item " + item + ")";
 }
 
-TEST(AudioChannelLayoutObject, LabelConstantsAreTheirLabels) {
+// The constants are exactly the labels the library describes, but the
+// higher-order ambisonic 143.
+TEST(AudioChannelLayoutObject, LabelConstantsAreTheDescribedLabels) {
   Script script;
+  std::set<double> values;
   for (const AudioChannelLabelConstant& constant : GetAudioChannelLabelConstants()) {
     SCOPED_TRACE(constant.name);
-    EXPECT_EQ(script.Run(std::string("AudioChannelLayout.") + constant.name).GetNumber(),
-              static_cast<double>(constant.label));
+    const double value = script.Run(std::string("AudioChannelLayout.") + constant.name).GetNumber();
+    EXPECT_EQ(value, static_cast<double>(constant.label));
+    values.insert(value);
     EXPECT_EQ(Description("AudioChannelLayout", constant.name), constant.description);
+  }
+  EXPECT_EQ(values.size(), GetAudioChannelLabelConstants().size());
+  for (int value = -1; value <= 300; ++value) {
+    SCOPED_TRACE(value);
+    EXPECT_EQ(!AudioChannelLabelDescription(
+                   static_cast<AudioChannelLabel>(static_cast<std::uint32_t>(value)), false)
+                   .empty(),
+              values.count(value) == 1 || value == 143);
   }
 }
 
@@ -80,7 +93,6 @@ TEST(AudioChannelLayoutObject, LayoutConstantsAreTheCatalogueEntries) {
     if (i == 3) description.insert(description.find("Front-Left") + 10, " ");  // BROADCAST51
     EXPECT_EQ(entry.description, description);
   }
-  EXPECT_EQ(catalogue[29].factory(), catalogue[31].factory());  // PENTAGONAL, L_R_LS_RS_C
 }
 
 TEST(PixelFormatObject, ConstantsAreTheFourCCsOfTheirFormats) {
@@ -102,12 +114,20 @@ TEST(PixelFormatObject, ConstantsAreTheFourCCsOfTheirFormats) {
   EXPECT_EQ(PixelFormatFourCCText(static_cast<PixelFormatName>(0xFF1F7E80u)), "?~ ?");
 }
 
-TEST(ScriptMediaObjects, DefinitionsListTheirItemsInOrder) {
+// Every class, its items in definition order; only constructors lack 0x80000.
+TEST(ScriptDefinition, EveryClassListsItsItemsInOrder) {
   struct Case {
     const char* className;
     const char* items;  // constants of the label, layout and pixel-format tables left out
   };
   const Case kCases[] = {
+      {"TickTime",
+       " seconds equals ticks ticksNumber timecodeToTime timeToTimecode alignToNearestFrame "
+       "alignToFrame TIME_ZERO TIME_ONE_SECOND TIME_ONE_MINUTE TIME_ONE_HOUR TIME_MAX TIME_MIN "
+       "TIME_INVALID"},
+      {"FrameRate", " ticksPerFrame createWithValue"},
+      {"RatioTime", "createRatioTime value scale"},
+      {"TimeDisplay", " type customFPS"},
       {"AudioChannelLayout",
        "length [] description label createCommonAudioChannelLayout createAudioChannelLayout"},
       {"AudioBusDescription", " name layout type TYPE_MAIN TYPE_AUXILIARY"},
@@ -156,12 +176,8 @@ TEST(ScriptMediaObjects, EqualObjectsHashAlike) {
       {"AudioChannelLayout.createAudioChannelLayout([100, 101])",
        "AudioChannelLayout.createAudioChannelLayout([101, 100])", false},
       {"new AudioFormat(48000, 24)", "new AudioFormat(48000, 20)", true},
-      {"new AudioFormat(48000, 24)", "new AudioFormat(48000, 32)", false},
       {"new AudioChannelMap([0, 1])", "new AudioChannelMap(new AudioChannelMap([0, 1]))", true},
-      {"new AudioChannelMap([0, 1])", "new AudioChannelMap([0, 2])", false},
-      {"var b = new AudioBusDescription(); b.name = 'x'; b",
-       "var c = new AudioBusDescription(); c.name = 'x'; c", true},
-      {"new AudioBusDescription()", "var d = new AudioBusDescription(); d.type = 1; d", false},
+      {"new AudioBusDescription()", "new AudioBusDescription()", true},
       {"PixelFormat.createPixelFormat('bgra')", "PixelFormat.createPixelFormat('bgra')", true},
       {"PixelFormat.createPixelFormat('bgra')", "PixelFormat.createPixelFormat('bgrx')", false},
   };
@@ -214,16 +230,6 @@ TEST(AudioFormatObject, WithoutALayoutObjectNothingIsHeld) {
   EXPECT_EQ(constructed->GetAudioFormat().GetChannelLayout(), CreateMonoChannelLayout());
   EXPECT_FALSE(constructed->GetChannelLayout());
   EXPECT_EQ(CreateAudioFormatObject(stereo, goneContext), nullptr);
-}
-
-TEST(ColorObject, TransformMakesAColorObjectInTheContext) {
-  Script script;
-  const ScriptObjectPtr object =
-      zebscripting::utility::TransformObjectIntoScriptingObject<color::RGBA>()(
-          color::RGBA(0.25f, 0.5f, 0.75f, 0.125f), script.Handle());
-  ASSERT_TRUE(object);
-  EXPECT_EQ(object->GetContextHandle(), script.Handle());
-  EXPECT_EQ(static_cast<const ColorObject&>(*object).GetColorRGBA().Alpha(), 0.125f);
 }
 
 }  // namespace

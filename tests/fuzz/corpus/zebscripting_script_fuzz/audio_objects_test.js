@@ -1,1 +1,0 @@
-../../../scripting/audio_objects_test.js

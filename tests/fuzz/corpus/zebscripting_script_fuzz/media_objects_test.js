@@ -1,0 +1,1 @@
+../../../scripting/media_objects_test.js

@@ -1,1 +1,0 @@
-../../../scripting/video_objects_test.js
