@@ -1,24 +1,15 @@
-// Localizer, errors, assertions, logging, console, start-up, rationals, base64
-// and the small value helpers.
+// Localizer, assertions, start-up, rationals and base64.
 
 #include <gtest/gtest.h>
-#include <zebcore/allocator.h>
 #include <zebcore/assert.h>
 #include <zebcore/binary_text.h>
-#include <zebcore/cached_serializer.h>
-#include <zebcore/console.h>
-#include <zebcore/error.h>
 #include <zebcore/initializer.h>
-#include <zebcore/json.h>
 #include <zebcore/localizer.h>
-#include <zebcore/logging.h>
-#include <zebcore/mutex.h>
 #include <zebcore/rational.h>
 
 #include <climits>
 #include <cmath>
 #include <random>
-#include <sstream>
 #include <string>
 #include <vector>
 
@@ -50,23 +41,6 @@ TEST(Localizer, GivesTheTranslationOrTheDefault) {
   localizer.ClearTranslations();
 }
 
-TEST(Localizer, ThrowErrorCarriesTheLocalizedText) {
-  using namespace zebcore::config;
-  auto what = [] {
-    try {
-      ThrowError(kInputContractViolation);
-    } catch (const Error& e) {
-      return std::string(e.Key() == kInputContractViolation ? e.what() : "another key");
-    }
-    return std::string("no exception");
-  };
-  EXPECT_EQ(what(), "An input contract violation has occurred!");
-  Localizer::Get().InstallTranslations(
-      {{"$$$/zebcore/utility/Error/Contract/InputContractViolation", u"Vertrag verletzt \u00FC"}});
-  EXPECT_EQ(what(), "Vertrag verletzt \xC3\xBC");
-  Localizer::Get().ClearTranslations();
-}
-
 TEST(Assertion, CaptureSeesEveryFieldAndANestedCaptureRestoresTheOuterOne) {
   namespace zd = zebcore::debug;
   zd::ScopedAssertionCapture capture;
@@ -84,85 +58,6 @@ TEST(Assertion, CaptureSeesEveryFieldAndANestedCaptureRestoresTheOuterOne) {
   }
   zd::ReportAssertion("x", "outer", "", "", 2);
   EXPECT_EQ(capture.Count(), 2u);
-}
-
-TEST(Assertion, WithoutAHookReportsOneLineToStandardError) {
-  ::testing::internal::CaptureStderr();
-  zebcore::debug::ReportAssertion("rate > 0", "No rate", "time.cpp", "Align", 7);
-  EXPECT_EQ(::testing::internal::GetCapturedStderr(),
-            "ASSERT: No rate (rate > 0) in Align [time.cpp:7]\n");
-}
-
-TEST(Logging, RecordsReachTheSinkAndTheStructuredTrace) {
-  namespace zl = zebcore::logging;
-  std::vector<zl::LogRecord> logged;
-  Strings traced;
-  zl::SetLogSink([&](const zl::LogRecord& r) { logged.push_back(r); });
-  zl::SetTraceSink(
-      [&](std::string_view category, int level, std::string_view text) {
-        traced.push_back((std::string(category) + "/" + std::to_string(level) + "/").append(text));
-      },
-      4);
-  zl::LogRecord record;
-  record.message = "Opened";
-  record.fields = {
-      {"frames", std::int64_t{25}}, {"name", zs::ToUTF8String("clip \"1\"")}, {"drop", true}};
-  zl::Log(record);
-  zl::LogException("Reader", std::runtime_error("bad file"));
-  zl::Trace("x", 5, "too detailed");  // above the level: dropped
-  zl::SetLogSink({});
-  zl::SetTraceSink({}, 0);
-  zl::Log(record);  // dropped, no crash
-  ASSERT_EQ(logged.size(), 2u);
-  EXPECT_EQ(logged[0].message + "|" + logged[1].source + ": " + logged[1].message,
-            "Opened|Reader: bad file");
-  ASSERT_EQ(traced.size(), 2u);
-  EXPECT_EQ(traced[0],
-            "zebcore.StructuredLogging/4/Opened, frames: 25, name: \"clip \\\"1\\\"\", drop: "
-            "true\r\n");
-}
-
-TEST(RecursiveMutex, IsRecursiveAndReportsAnUnlockWithoutAHold) {
-  zebcore::threads::RecursiveMutex mutex(nullptr);
-  EXPECT_EQ(mutex.Name(), "");  // a null name is empty
-  zebcore::debug::ScopedAssertionCapture capture;
-  mutex.Unlock();  // never held
-  EXPECT_EQ(capture.Count(), 1u);
-  ASSERT_TRUE(mutex.Lock("outer", 100));
-  EXPECT_TRUE(zebcore::threads::RecursiveLockGuard(mutex, "inner", 100));  // held and let go
-  mutex.Unlock();
-  mutex.Unlock();  // one release too many
-  EXPECT_EQ(capture.Count(), 2u);
-  ASSERT_TRUE(mutex.Lock("again", 0));  // still free
-  mutex.Unlock();
-}
-
-class EchoCommand final : public zebcore::console::Command {
- public:
-  void Execute(const UTF16String& arguments, zs::UTF16OStream& out) override {
-    out << u"echo " << arguments << ' ' << 3 << zs::endl;
-  }
-};
-
-TEST(CommandRegistry, RegistersRunsAndUnregisters) {
-  auto& registry = zebcore::console::CommandRegistry::Get();
-  const UTF16String name = u"zebcore.test.Echo";
-  auto factory = [] { return std::make_shared<EchoCommand>(); };
-  ASSERT_TRUE(registry.RegisterCommand(name, u"Echoes its arguments.", factory));
-  EXPECT_FALSE(registry.RegisterCommand(name, u"again", factory));  // taken
-  EXPECT_FALSE(registry.RegisterCommand(
-      u"zebcore.test.None", u"", [] { return std::shared_ptr<zebcore::console::Command>(); }));
-  EXPECT_FALSE(registry.RegisterCommand(u"zebcore.test.Empty", u"", {}));
-  EXPECT_TRUE(registry.HasCommand(name) && !registry.HasCommand(u"zebcore.test.None"));
-
-  std::ostringstream narrow;
-  zebcore::console::ConsoleOutputStream out(narrow);
-  EXPECT_TRUE(registry.Execute(name, u"\u00E9\U0001F3AC", out));
-  EXPECT_EQ(narrow.str(), "echo \xC3\xA9\xF0\x9F\x8E\xAC 3\n");
-  EXPECT_FALSE(registry.Execute(u"zebcore.test.Missing", u"", out));
-
-  EXPECT_EQ(registry.UnregisterCommand(name).use_count(), 1);  // the registry let go of it
-  EXPECT_FALSE(registry.HasCommand(name) || registry.UnregisterCommand(name));
 }
 
 Strings& Calls() {
@@ -284,30 +179,6 @@ TEST(Base64, RejectsBadTextAndKeepsTheGroupsBeforeIt) {
     EXPECT_FALSE(zebcore::utility::DecodeBinaryDataFromUTF8String(zs::ToUTF8String(c.text), out));
     EXPECT_EQ(out.size(), c.bytesKept);
   }
-}
-
-TEST(RecycledMemory, SharesZeroedBytes) {
-  auto block = zebcore::allocator::RecycledMemory::Create(0);
-  EXPECT_EQ(block->GetData(), nullptr);
-  ASSERT_NE(block->Allocate(16), nullptr);
-  block->GetData()[0] = 7;
-  const auto shared = block;
-  const unsigned char* data = block->Allocate(32);
-  // The first byte is kept; all others are zero.
-  EXPECT_EQ(std::string(data, data + shared->GetSize()), "\x07" + std::string(31, '\0'));
-  EXPECT_EQ(block->Allocate(0), nullptr);
-}
-
-TEST(CachedSerializer, MapsBothWaysAndReplacesEitherSide) {
-  zebcore::serialization::CachedSerializer<int> cache;
-  auto u8 = [](const char* s) { return zs::ToUTF8String(s); };
-  cache.Add(u8("one"), 1);
-  cache.Add(u8("two"), 2);
-  EXPECT_EQ(cache.FindValue(u8("two")), 2);
-  cache.Add(u8("uno"), 1);  // the value's old text goes
-  EXPECT_FALSE(cache.FindValue(u8("one")));
-  EXPECT_EQ(cache.FindText(1), u8("uno"));
-  EXPECT_EQ(cache.Size(), 2u);
 }
 
 }  // namespace

@@ -1,7 +1,6 @@
 // Colour records, their texts and identifiers, the caches and RGBA.
 #include <gtest/gtest.h>
 #include <zebcore/assert.h>
-#include <zebcore/localizer.h>
 #include <zebmediatypes/color/color_serialization.h>
 #include <zebmediatypes/color/rgba.h>
 #include <zebmediatypes/initialization.h>
@@ -58,21 +57,6 @@ ColorManagementSettings Settings(std::uint32_t luminance, std::uint32_t method,
 // ---------------------------------------------------------------------------
 // Records and identifiers.
 
-TEST(ColorSpace, PredicatesAndTypeStringFollowTheType) {
-  const std::pair<std::uint32_t, const char*> kCases[] = {
-      {0, ""}, {1, "tagged"}, {2, "icc"}, {3, "ocio"}, {4, ""}, {5, ""}, {0xFFFFFFFFu, ""},
-  };
-  for (const auto& [type, typeString] : kCases) {
-    SCOPED_TRACE(type);
-    const ColorSpace s = MakeSpace("", type);
-    EXPECT_EQ((std::array{s.IsModel(), s.IsICC(), s.IsOCIO(), s.IsNonColorManaged()}),
-              (std::array{type == 1, type == 2, type == 3, type == 4}));
-    EXPECT_EQ(ToStdString(s.GetColorSpaceTypeString()), typeString);
-    // An empty profile is an empty space with no identifier, whatever the type.
-    EXPECT_TRUE(s.empty() && s.ToGuid().IsNull() && s.cachedGuid.IsNull());
-  }
-}
-
 TEST(ColorProfile, IdentifiersHashTheContentInOrder) {
   const auto id = [](const ColorSpace& s) { return s.baseColorProfile.ToGuid().ToString(); };
   Bytes twenty(20);
@@ -83,15 +67,6 @@ TEST(ColorProfile, IdentifiersHashTheContentInOrder) {
   // A zero-byte block hashes like no block (on its own it still makes a
   // profile that is not empty, see the golden texts).
   EXPECT_EQ(id(WithBytes(MakeSpace("P3"), {})), id(MakeSpace("P3")));
-}
-
-TEST(ColorSpace, MemoKeepsTheFirstIdentifierUntilCleared) {
-  ColorSpace space = DefaultSpace();
-  const Guid first = space.ToGuid();
-  space.baseProfileType = kColorSpaceType_ICC;
-  EXPECT_EQ(space.ToGuid(), first);
-  space.cachedGuid = Guid();
-  EXPECT_NE(space.ToGuid(), first);
 }
 
 TEST(ColorSpace, OrderingIsStrictWeakAndAgreesWithEquality) {
@@ -114,32 +89,6 @@ TEST(ColorSpace, OrderingIsStrictWeakAndAgreesWithEquality) {
       EXPECT_EQ(!(a < b) && !(b < a), a == b);
       for (const ColorSpace& c : values) EXPECT_FALSE(a < b && b < c && !(a < c));
     }
-}
-
-TEST(ColorManagementSettings, IsValidExactlyForTheDescribedLuminances) {
-  for (std::uint32_t nits : {0u, 99u, 100u, 203u, 250u, 300u, 0xFFFFFFFFu}) {
-    SCOPED_TRACE(nits);
-    const auto luminance = static_cast<GraphicsWhiteLuminance>(nits);
-    EXPECT_EQ(Settings(nits, 1, "x", 1, true).IsValid(),
-              !GetGraphicsWhiteLuminanceDescription(luminance).empty());
-  }
-  EXPECT_EQ(GetGraphicsWhiteLuminanceDescription(kGraphicsWhiteLuminance_203),
-            u"203 (75% HLG, 58% PQ)");
-}
-
-TEST(ColorDescriptions, OnlyTheLocalizedTextFollowsTranslations) {
-  constexpr auto kOCIO = kColorManagementSystem_OCIO;
-  EXPECT_EQ(GetLUTInterpolationMethodDescription(kLUTInterpolationMethod_Tetrahedral, 1),
-            u"Tetrahedral (requires GPU acceleration)");
-  EXPECT_EQ(GetLUTInterpolationMethodDescription(kLUTInterpolationMethod_Tetrahedral, 2),
-            u"Tetrahedral");
-  EXPECT_EQ(GetColorManagementSystemDescription(static_cast<ColorManagementSystem>(2), 1), u"");
-  zebcore::config::Localizer::Get().InstallTranslations(
-      {{"$$$/zebmediatypes/ColorManagementSystem/OCIO", u"OCIO g\u00E9r\u00E9"}});
-  EXPECT_EQ(GetColorManagementSystemDescription(kOCIO, 1), u"OCIO g\u00E9r\u00E9");
-  EXPECT_EQ(GetColorManagementSystemDescription(kOCIO, 0), u"OCIO color managed");
-  zebcore::config::Localizer::Get().ClearTranslations();
-  EXPECT_EQ(GetColorSpaceDescription(MakeSpace("P3 \xE2\x80\x94 PQ")), u"P3 \u2014 PQ");
 }
 
 // ---------------------------------------------------------------------------
@@ -377,15 +326,6 @@ TEST(ColorSpaceCache, LockTimeoutRunsNothingAndReports) {
   // Nothing was entered or replaced while the lock was out of reach.
   EXPECT_EQ(RetrieveColorSpaceFromCache(space.ToGuid()), ColorSpace());
   EXPECT_EQ(GetDefaultColorSpace(), DefaultSpace());
-}
-
-TEST(SerializationCache, ClearAllEmptiesBothCaches) {
-  auto& spaces = SerializationCache::GetColorSpaceCache();
-  const ColorSpace space = MakeSpace("text-cached", 2);
-  spaces.Add(space.ToSerializedString(), space);
-  SerializationCache::GetColorProfileCache().Add(U8("profile"), space.baseColorProfile);
-  SerializationCache::ClearAll();
-  EXPECT_EQ(SerializationCache::GetColorProfileCache().Size() + spaces.Size(), 0u);
 }
 
 // ---------------------------------------------------------------------------

@@ -80,18 +80,6 @@ TEST(Lifecycle, UnbalancedTerminateIsReportedAndDoesNotWrap) {
   EXPECT_EQ(capture.Count(), 2u);
 }
 
-TEST(Lifecycle, CommandsArePresentOnlyWhileStarted) {
-  ASSERT_TRUE(IsStopped());
-  EXPECT_FALSE(CommandsPresent());
-  ASSERT_TRUE(zebcore::config::StartUp());
-  const bool present = CommandsPresent();
-  EXPECT_EQ(GetDefaultColorSpace(), DefaultSpace());
-  zebcore::config::ShutDown();
-  EXPECT_FALSE(CommandsPresent());
-  EXPECT_TRUE(IsStopped());
-  if (!present) GTEST_SKIP() << "the time console commands are not built into this library";
-}
-
 TEST(Lifecycle, FailedStartLeavesTheCountAndRegistersNothing) {
   ASSERT_TRUE(IsStopped());
   {
