@@ -416,12 +416,23 @@ bool RunNative(const std::string& label, F&& call, PendingError& error) {
   }
 }
 
-duk_ret_t ItemGetter(duk_context* ctx) {
-  Impl& impl = GetImpl(ctx);
-  const BoundItem& bound = impl.items[static_cast<std::size_t>(duk_get_current_magic(ctx))];
+// The item behind the native function the engine is calling (its magic number).
+const BoundItem& CurrentItem(duk_context* ctx, const Impl& impl) {
+  return impl.items[static_cast<std::size_t>(duk_get_current_magic(ctx))];
+}
+
+// A call of `bound` from script: the calling context, and the receiver unless
+// the item is static.
+ScriptCall CallOf(duk_context* ctx, Impl& impl, const BoundItem& bound) {
   ScriptCall call;
   call.contextHandle = impl.owner->GetHandle();
   if (!bound.item->IsStatic()) call.self = ThisObject(ctx, impl, bound.label);
+  return call;
+}
+
+// Runs `bound` and leaves its result on the value stack.
+duk_ret_t InvokeAndPush(duk_context* ctx, Impl& impl, const BoundItem& bound,
+                        const ScriptCall& call) {
   ScriptValue result;
   PendingError error;
   if (!RunNative(
@@ -432,9 +443,15 @@ duk_ret_t ItemGetter(duk_context* ctx) {
   return 1;
 }
 
+duk_ret_t ItemGetter(duk_context* ctx) {
+  Impl& impl = GetImpl(ctx);
+  const BoundItem& bound = CurrentItem(ctx, impl);
+  return InvokeAndPush(ctx, impl, bound, CallOf(ctx, impl, bound));
+}
+
 duk_ret_t ItemSetter(duk_context* ctx) {
   Impl& impl = GetImpl(ctx);
-  const BoundItem& bound = impl.items[static_cast<std::size_t>(duk_get_current_magic(ctx))];
+  const BoundItem& bound = CurrentItem(ctx, impl);
   if (!bound.item->HasSetter()) {
     Throw(ctx, {DUK_ERR_TYPE_ERROR, bound.label + " is read-only"});
   }
@@ -454,20 +471,11 @@ duk_ret_t ItemSetter(duk_context* ctx) {
 
 duk_ret_t ItemMethod(duk_context* ctx) {
   Impl& impl = GetImpl(ctx);
-  const BoundItem& bound = impl.items[static_cast<std::size_t>(duk_get_current_magic(ctx))];
-  ScriptCall call;
-  call.contextHandle = impl.owner->GetHandle();
-  if (!bound.item->IsStatic()) call.self = ThisObject(ctx, impl, bound.label);
+  const BoundItem& bound = CurrentItem(ctx, impl);
+  ScriptCall call = CallOf(ctx, impl, bound);
   const std::vector<ScriptValue> arguments = Arguments(ctx, impl);
   call.arguments = ScriptArguments(arguments);
-  ScriptValue result;
-  PendingError error;
-  if (!RunNative(
-          bound.label, [&] { result = bound.item->Invoke(call); }, error)) {
-    Throw(ctx, error);
-  }
-  PushValue(ctx, impl, result);
-  return 1;
+  return InvokeAndPush(ctx, impl, bound, call);
 }
 
 duk_ret_t ClassConstructor(duk_context* ctx) {
@@ -590,14 +598,7 @@ duk_ret_t ProxyGet(duk_context* ctx) {
       call.contextHandle = impl.owner->GetHandle();
       call.self = object;
       call.arguments = ScriptArguments(&argument, 1);
-      ScriptValue result;
-      PendingError error;
-      if (!RunNative(
-              bound.label, [&] { result = bound.item->Invoke(call); }, error)) {
-        Throw(ctx, error);
-      }
-      PushValue(ctx, impl, result);
-      return 1;
+      return InvokeAndPush(ctx, impl, bound, call);
     }
   }
   duk_dup(ctx, 1);
