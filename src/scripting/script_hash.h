@@ -22,4 +22,11 @@ class Fnv1aHash {
   std::uint64_t hash_ = 14695981039346656037ull;
 };
 
+// The hash of one integer's `count` low bytes, lowest first.
+inline std::uint64_t Fnv1a(std::uint64_t value, int count) noexcept {
+  Fnv1aHash hash;
+  hash.Add(value, count);
+  return hash.Value();
+}
+
 }  // namespace zebmediatypes::scripting

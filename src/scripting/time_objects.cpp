@@ -7,7 +7,10 @@
 #include <boost/rational.hpp>
 #include <cmath>
 #include <limits>
+#include <numeric>
 #include <string>
+
+#include "scripting/script_hash.h"
 
 namespace zebmediatypes::scripting {
 namespace {
@@ -17,16 +20,6 @@ using zebscripting::PropertyType;
 using zebscripting::definition::kItemFlag_Host;
 using zebscripting::definition::ScriptObjectDefinitionBase;
 namespace def = zebscripting::definition;
-
-// 64-bit FNV-1a over the `count` low bytes of `value`, lowest byte first.
-std::uint64_t Fnv1a(std::uint64_t value, int count) noexcept {
-  std::uint64_t hash = 14695981039346656037ull;
-  for (int i = 0; i < count; ++i) {
-    hash ^= (value >> (8 * i)) & 0xFFu;
-    hash *= 1099511628211ull;
-  }
-  return hash;
-}
 
 // The value of an object parameter through its cast interface: `fallback` for
 // a missing (null) object, ParameterErrorException for an object without one.
@@ -59,14 +52,7 @@ bool ReduceRatio(std::int64_t value, std::int64_t scale, RatioTime& ratio) noexc
   };
   std::uint64_t a = magnitude(value);
   std::uint64_t b = magnitude(scale);
-  std::uint64_t x = a;
-  std::uint64_t y = b;
-  while (y != 0) {
-    const std::uint64_t r = x % y;
-    x = y;
-    y = r;
-  }
-  const std::uint64_t divisor = x == 0 ? 1 : x;
+  const std::uint64_t divisor = std::gcd(a, b);  // b != 0, so at least 1
   a /= divisor;
   b /= divisor;
   const bool negative = (value < 0) != (scale < 0) && a != 0;
